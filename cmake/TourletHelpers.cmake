@@ -1,0 +1,28 @@
+# tourlet_add_test(NAME <name> SOURCES <files...> [LIBS <targets...>] [WINDOW])
+# Builds one Qt Test executable and registers it with CTest. WINDOW tests need an
+# OpenGL surface and run under xvfb-run; the others use the offscreen platform.
+function(tourlet_add_test)
+  cmake_parse_arguments(T "WINDOW" "NAME" "SOURCES;LIBS" ${ARGN})
+  find_package(Qt5 REQUIRED COMPONENTS Test)
+  add_executable(${T_NAME} ${T_SOURCES})
+  target_link_libraries(${T_NAME} PRIVATE tourlet_core Qt5::Test ${T_LIBS})
+  target_include_directories(${T_NAME} PRIVATE ${PROJECT_SOURCE_DIR}/tests/common)
+  target_compile_definitions(${T_NAME} PRIVATE TOURLET_TEST_DATA="${CMAKE_CURRENT_SOURCE_DIR}/data")
+  if(T_WINDOW)
+    add_test(NAME ${T_NAME} COMMAND xvfb-run -a -s "-screen 0 1280x1024x24" $<TARGET_FILE:${T_NAME}>)
+  else()
+    add_test(NAME ${T_NAME} COMMAND ${T_NAME})
+    set_tests_properties(${T_NAME} PROPERTIES ENVIRONMENT "QT_QPA_PLATFORM=offscreen")
+  endif()
+endfunction()
+
+# Adds every direct subfolder of the current source folder that has a CMakeLists.txt.
+function(tourlet_add_subfolders)
+  file(GLOB children LIST_DIRECTORIES true RELATIVE ${CMAKE_CURRENT_SOURCE_DIR} ${CMAKE_CURRENT_SOURCE_DIR}/*)
+  list(SORT children)
+  foreach(child ${children})
+    if(EXISTS ${CMAKE_CURRENT_SOURCE_DIR}/${child}/CMakeLists.txt)
+      add_subdirectory(${child})
+    endif()
+  endforeach()
+endfunction()

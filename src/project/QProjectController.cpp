@@ -1,0 +1,123 @@
+#include "project/QProjectController.h"
+
+#include "app/Trace.h"
+
+#include <QFile>
+#include <QSettings>
+#include <QStringList>
+
+namespace {
+QString address(const QString &section, const QString &key)
+{
+    return QStringLiteral("%1/%2").arg(section, key);
+}
+}
+
+QProjectController::QProjectController() = default;
+
+QProjectController::~QProjectController()
+{
+    closeProjectFile();
+}
+
+void QProjectController::startWriter(const QString &fileName)
+{
+    m_writer = std::make_unique<QSettings>(fileName, QSettings::IniFormat);
+    m_writer->setValue(QStringLiteral("Header/projecttype"), QString::fromLatin1(ProjectFormat::projectIdentifier));
+    m_writer->setValue(QStringLiteral("Header/projectversion"), ProjectFormat::currentVersion);
+    m_writer->sync();
+}
+
+bool QProjectController::createProjectFile(QString fileName)
+{
+    if (!isIdle()) {
+        logTrace(3, QStringLiteral("QProjectController::createProjectFile[%s] - writer/reader object always created"), fileName);
+        return false;
+    }
+    // The old file goes before the new one is written: callers that must not
+    // lose it keep their own copy first.
+    if (QFile::exists(fileName))
+        QFile::remove(fileName);
+    {
+        QFile file(fileName);
+        if (file.open(QIODevice::WriteOnly))
+            file.close();
+    }
+    if (!QFile::exists(fileName)) {
+        logTrace(3, QStringLiteral("QProjectController::createProjectFile: can't create file %s"), fileName);
+        m_fileName.clear();
+        return true;
+    }
+    startWriter(fileName);
+    m_fileName = fileName;
+    return true;
+}
+
+bool QProjectController::openProjectFile(QString fileName, bool forLoad)
+{
+    if (!isIdle()) {
+        logTrace(3, QStringLiteral("QProjectController::openProjectFile[%s] - writer/reader object always created"), fileName);
+        return false;
+    }
+    if (!forLoad) {
+        m_fileName = fileName;
+        startWriter(fileName);
+        return true;
+    }
+    if (!QFile::exists(fileName)) {
+        logTrace(3, QStringLiteral("QProjectController::openProjectFile for load: file %s doesn't exist"), fileName);
+        return false;
+    }
+    m_fileName = fileName;
+    m_reader = std::make_unique<QSettings>(fileName, QSettings::IniFormat);
+    const QVariant type = m_reader->value(QStringLiteral("Header/projecttype"), QVariant());
+    const QString found = type.toString();
+    if (found != QLatin1String(ProjectFormat::projectIdentifier)) {
+        logTrace(3, QStringLiteral("ProjectController::openProjectFile:%s - no valid projectfile - wrong projectFileIndentifier %s."),
+                 fileName, found);
+        return false;
+    }
+    m_projectVersion = m_reader->value(QStringLiteral("Header/projectversion"), 0).toUInt();
+    if (m_projectVersion > ProjectFormat::highestAcceptedVersion) {
+        logTrace(3, QStringLiteral("ProjectController::openProjectFile:%s - no valid projectfile - wrong projectVersion %d"),
+                 fileName, m_projectVersion);
+        return false;
+    }
+    return true;
+}
+
+bool QProjectController::writeProperty(QString section, QString key, QString value)
+{
+    if (!m_writer) {
+        logTrace(3, QStringLiteral("QProjectController::writeProperty[%s]: writer object doesn't exist"), m_fileName);
+        return false;
+    }
+    m_writer->setValue(address(section, key), value);
+    return true;
+}
+
+QString QProjectController::readProperty(QString section, QString key, QString defaultValue)
+{
+    if (!m_reader) {
+        logTrace(3, QStringLiteral("QProjectController::writeProperty: file %s doesn't exist"), m_fileName);
+        return QString();
+    }
+    const QVariant value = m_reader->value(address(section, key));
+    if (!value.isValid())
+        return defaultValue;
+    // A hand-edited line with unquoted commas reads as a list; keep its text.
+    if (value.type() == QVariant::StringList)
+        return value.toStringList().join(QLatin1Char(','));
+    return value.toString();
+}
+
+bool QProjectController::closeProjectFile()
+{
+    // The writer is synced before it goes, so the next open in the same turn
+    // sees the whole file.
+    if (m_writer)
+        m_writer->sync();
+    m_writer.reset();
+    m_reader.reset();
+    return true;
+}

@@ -1,0 +1,7 @@
+#include "Commands.h"
+
+std::vector<CliCommand> allCommands()
+{
+    std::vector<CliCommand> commands;
+    return commands;
+}

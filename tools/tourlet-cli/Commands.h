@@ -1,0 +1,8 @@
+#pragma once
+
+#include "CliCommand.h"
+
+#include <vector>
+
+// Every subcommand, in the order --help lists them. Each lives in its own file.
+std::vector<CliCommand> allCommands();
