@@ -4,11 +4,11 @@
 
 namespace {
 uint32_t g_nextPointId = 1;
+}
 
 uint32_t drawPointId()
 {
     return g_nextPointId++;
-}
 }
 
 BasePoint::BasePoint() : id(drawPointId()) {}

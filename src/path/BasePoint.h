@@ -38,4 +38,7 @@ protected:
 };
 
 // Index written to the file for a reference that names nothing.
+// The next id of the counter that all point kinds share; first value 1.
+uint32_t drawPointId();
+
 constexpr uint32_t noPointIndex = 0xFFFFFFFFu;

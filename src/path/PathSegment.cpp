@@ -1,0 +1,143 @@
+#include "path/PathSegment.h"
+
+#include "project/ProjectController.h"
+#include "project/ValueParsers.h"
+
+
+namespace {
+
+uint32_t nextSegmentId()
+{
+    static uint32_t counter = 1;
+    return counter++;
+}
+
+PilotProperties &defaultPilotRecord()
+{
+    static PilotProperties record;
+    return record;
+}
+
+QString key(const char *name)
+{
+    return QString::fromLatin1(name);
+}
+
+} // namespace
+
+const PilotProperties &defaultPilot()
+{
+    return defaultPilotRecord();
+}
+
+void setDefaultPilot(const PilotProperties &pilot)
+{
+    defaultPilotRecord() = pilot;
+}
+
+void PilotProperties::Save(ProjectController &store, const QString &section) const
+{
+    store.writeProperty(section, key("pilot_isAnimated"), formatBool(hasFlag(isAnimated)));
+    store.writeProperty(section, key("pilot_rotation"), formatBool(hasFlag(rotation)));
+    store.writeProperty(section, key("pilot_symmetric"), formatBool(hasFlag(symmetric)));
+    store.writeProperty(section, key("pilot_source"), source);
+    store.writeProperty(section, key("pilot_thumb"), thumb);
+    store.writeProperty(section, key("pilot_displayFormat"), displayFormat);
+    store.writeProperty(section, key("pilot_width"), formatDouble(width));
+}
+
+void PilotProperties::Load(ProjectController &store, const QString &section)
+{
+    bool on = false;
+    if (initBool(store.readProperty(section, key("pilot_isAnimated"), QString()), on))
+        setFlag(isAnimated, on);
+    if (initBool(store.readProperty(section, key("pilot_rotation"), QString()), on))
+        setFlag(rotation, on);
+    if (initBool(store.readProperty(section, key("pilot_symmetric"), QString()), on))
+        setFlag(symmetric, on);
+    initString(store.readProperty(section, key("pilot_source"), QString()), source);
+    initString(store.readProperty(section, key("pilot_thumb"), QString()), thumb);
+    initString(store.readProperty(section, key("pilot_displayFormat"), QString()), displayFormat);
+    initDouble(store.readProperty(section, key("pilot_width"), QString()), width);
+}
+
+PathSegment::PathSegment(uint32_t keyPointId_)
+    : id(nextSegmentId()), keyPointId(keyPointId_), pilot(defaultPilot())
+{
+}
+
+void PathSegment::setCurvePoints(std::vector<CurvePoint> &&points)
+{
+    bool same = points.size() == curvePoints.size();
+    for (size_t i = 0; same && i < points.size(); ++i) {
+        // NaN never equals itself, so it always counts as a change.
+        same = points[i].x == curvePoints[i].x && points[i].y == curvePoints[i].y;
+    }
+    if (same)
+        return;
+    curvePoints = std::move(points);
+    changed = true;
+}
+
+void PathSegment::resize(size_t n)
+{
+    if (n < curvePoints.size())
+        curvePoints.resize(n);
+}
+
+void PathSegment::assign(const PathSegment &other, bool copyId)
+{
+    if (copyId)
+        id = other.id;
+    keyPointId = other.keyPointId;
+    curvePoints = other.curvePoints;
+    pilot = other.pilot;
+    changed = false;
+}
+
+void PathSegment::setPilot(const PilotProperties &record, bool withWidth)
+{
+    pilot.source = record.source;
+    pilot.thumb = record.thumb;
+    pilot.displayFormat = record.displayFormat;
+    pilot.flags = record.flags;
+    if (withWidth)
+        pilot.width = record.width;
+}
+
+void PathSegment::remapCorrespondingIds(const std::vector<KeyPoint> &keyPoints, const std::vector<MediaPoint> &mediaPoints)
+{
+    for (CurvePoint &p : curvePoints) {
+        p.correspondingKeyPoint = p.correspondingKeyPoint < keyPoints.size() ? keyPoints[p.correspondingKeyPoint].id : 0;
+        p.correspondingMediaPoint =
+            p.correspondingMediaPoint < mediaPoints.size() ? mediaPoints[p.correspondingMediaPoint].id : 0;
+    }
+}
+
+QString PathSegment::sampleSection(const QString &section, int index)
+{
+    return QStringLiteral("%1curvepoint%2").arg(section).arg(index);
+}
+
+void PathSegment::saveHeader(ProjectController &store, const QString &section) const
+{
+    pilot.Save(store, section);
+    store.writeProperty(section, key("curvepoints"), formatInt(int64_t(curvePoints.size())));
+}
+
+bool PathSegment::Load(ProjectController &store, const QString &section)
+{
+    pilot.Load(store, section);
+    int32_t count = 0;
+    initInt(store.readProperty(section, key("curvepoints"), QString()), count);
+    curvePoints.clear();
+    for (int i = 0; i < count; ++i) {
+        // A damaged count must not make up samples: the list ends at its first missing record.
+        if (store.readProperty(sampleSection(section, i), key("x"), QString()).isEmpty())
+            break;
+        CurvePoint p;
+        p.Load(store, sampleSection(section, i));
+        curvePoints.push_back(p);
+    }
+    return true;
+}

@@ -1,0 +1,383 @@
+#include "path/CurveGenerator.h"
+#include "path/GeoDistance.h"
+#include "path/Path.h"
+#include "path/PathMode.h"
+
+#include <QGeoCoordinate>
+#include <QTest>
+
+#include <cmath>
+#include <limits>
+
+namespace {
+
+Path makePath(int32_t curveMode, const std::vector<QPointF> &points)
+{
+    Path path;
+    path.curveMode = curveMode;
+    for (size_t i = 0; i < points.size(); ++i)
+        path.addKeyPoint(points[i].x(), points[i].y(), 0.0, QString(), i + 1 == points.size());
+    return path;
+}
+
+int namingCount(const Path &path, uint32_t keyPointId)
+{
+    int n = 0;
+    for (const CurvePoint &c : path.curvePoints)
+        n += c.correspondingKeyPoint == keyPointId;
+    return n;
+}
+
+// The rules every edit must leave standing; `ordinary` adds that leg i starts at key point i.
+void checkInvariants(const Path &path, bool ordinary)
+{
+    QCOMPARE(path.pathSegments.size(), path.keyPoints.size());
+    for (size_t i = 0; i < path.keyPoints.size(); ++i) {
+        const KeyPoint &k = path.keyPoints[i];
+        QCOMPARE(k.correspondingPathSegmentId, path.pathSegments[i].id);
+        QCOMPARE(path.pathSegments[i].keyPointId, k.id);
+        if (path.keyPoints.size() > 1)
+            QCOMPARE(namingCount(path, k.id), 1);
+        if (ordinary && i + 1 < path.keyPoints.size()) {
+            const auto &leg = path.pathSegments[i].curvePoints;
+            QVERIFY(!leg.empty());
+            QCOMPARE(leg.front().correspondingKeyPoint, k.id);
+        }
+    }
+    for (size_t i = 0; i + 1 < path.pathSegments.size(); ++i) {
+        const auto &a = path.pathSegments[i].curvePoints;
+        const auto &b = path.pathSegments[i + 1].curvePoints;
+        if (ordinary && !b.empty()) {
+            QVERIFY(!a.empty());
+            QCOMPARE(a.back().x, b.front().x);
+            QCOMPARE(a.back().y, b.front().y);
+        }
+    }
+    for (const CurvePoint &c : path.curvePoints) {
+        QVERIFY(c.x >= -180.0 && c.x <= 180.0);
+        QVERIFY(c.y >= -90.0 && c.y <= 90.0);
+    }
+}
+
+// A track-like path: one sample per 0.01 degree along the equator, key points
+// on the first and last sample.
+Path makeTrackPath(int samples)
+{
+    Path path;
+    path.curveMode = CurveMode::Straight;
+    path.pathType = PathType::GPX;
+    path.fixedCurve = true;
+    for (int i = 0; i < samples; ++i)
+        path.addCurvePoint(i * 0.01, 0.0, 0.0);
+    KeyPoint first(0.0, 0.0, 0.0), last((samples - 1) * 0.01, 0.0, 0.0);
+    path.addKeyPoint(first, false);
+    path.addKeyPoint(last, false);
+    path.curvePoints.front().correspondingKeyPoint = first.id;
+    path.curvePoints.back().correspondingKeyPoint = last.id;
+    path.pathSegments.front().setCurvePoints(std::vector<CurvePoint>(path.curvePoints));
+    return path;
+}
+
+} // namespace
+
+class TestPath : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void degenerateInputs()
+    {
+        Path one = makePath(CurveMode::Smooth, {{5, 5}});
+        QVERIFY(one.curvePoints.empty());
+        QCOMPARE(one.pathSegments.size(), size_t(1));
+        QVERIFY(one.pathSegments.front().curvePoints.empty());
+
+        for (int32_t mode : {CurveMode::Straight, CurveMode::Smooth}) {
+            Path same = makePath(mode, {{7, 8}, {7, 8}});
+            QCOMPARE(same.curvePoints.size(), size_t(1));
+            QCOMPARE(same.curvePoints.front().correspondingKeyPoint, same.keyPoints.front().id);
+        }
+
+        Path airplane = makePath(CurveMode::Arc, {{0, 0}, {10, 10}, {20, 0}});
+        QVERIFY(airplane.curvePoints.empty());
+        Path vertical = makePath(CurveMode::Arc, {{3, 0}, {3, 10}});
+        for (const CurvePoint &c : vertical.curvePoints)
+            QVERIFY(std::isfinite(c.y));
+    }
+
+    void antimeridianLegs()
+    {
+        for (const auto &ends : std::vector<std::pair<double, double>>{{170, -170}, {-170, 170}}) {
+            Path path = makePath(CurveMode::Straight, {{ends.first, 10}, {ends.second, 10}});
+            QCOMPARE(path.curvePoints.size(), size_t(220));
+            double nearest180 = 180;
+            for (const CurvePoint &c : path.curvePoints) {
+                QVERIFY2(c.x >= -180 && c.x <= 180, qPrintable(QString::number(c.x)));
+                QVERIFY(std::fabs(c.x) >= 170 - 1e-9);
+                nearest180 = std::min(nearest180, 180 - std::fabs(c.x));
+            }
+            QVERIFY(nearest180 < 0.2); // it crosses, it does not turn back
+        }
+        Path direct = makePath(CurveMode::Straight, {{10, 0}, {-10, 0}});
+        QCOMPARE(direct.curvePoints.size(), size_t(220));
+        for (const CurvePoint &c : direct.curvePoints)
+            QVERIFY(c.x <= 10 && c.x >= -10);
+
+        // There and back across the line, smooth: every sample stays on the map.
+        Path round = makePath(CurveMode::Smooth, {{170, 0}, {-170, 5}, {175, 10}, {-175, -5}});
+        checkInvariants(round, true);
+    }
+
+    void arcShape()
+    {
+        Path arc = makePath(CurveMode::Arc, {{0, 0}, {10, 5}});
+        QCOMPARE(arc.curvePoints.size(), size_t(11));
+        QCOMPARE(arc.curvePoints.front().correspondingKeyPoint, arc.keyPoints[0].id);
+        QCOMPARE(arc.curvePoints.back().correspondingKeyPoint, arc.keyPoints[1].id);
+        // The apex stands half the span east of the start.
+        double top = -1e9;
+        double topX = 0;
+        for (const CurvePoint &c : arc.curvePoints) {
+            if (c.y > top) {
+                top = c.y;
+                topX = c.x;
+            }
+        }
+        QCOMPARE(topX, 5.0);
+        QCOMPARE(top, 15.0);
+        QVERIFY(std::fabs(arc.curvePoints.front().y) < 1e-5); // single-precision steps
+    }
+
+    void invariantsAfterEdits()
+    {
+        for (int32_t mode : {CurveMode::Straight, CurveMode::Smooth}) {
+            Path path = makePath(mode, {{0, 0}, {5, 5}, {10, 0}, {15, 5}});
+            checkInvariants(path, true);
+            const uint32_t second = path.keyPoints[1].id;
+
+            KeyPoint inserted(7, 9, 0);
+            path.insertKeyPoint(second, inserted, true);
+            QCOMPARE(path.keyPoints[2].id, inserted.id);
+            checkInvariants(path, true);
+
+            double x = 6, y = 6;
+            QVERIFY(path.changeKeyPointPosition(second, x, y));
+            QCOMPARE(path.keyPoints[1].longitude, 6.0);
+            QVERIFY(!path.changeKeyPointPosition(second, x, y)); // unchanged position
+            double ux = 1, uy = 1;
+            QVERIFY(!path.changeKeyPointPosition(999999, ux, uy));
+            checkInvariants(path, true);
+
+            QVERIFY(path.deleteKeyPoint(path.keyPoints.front().id));
+            checkInvariants(path, true);
+            QVERIFY(path.deleteKeyPoint(path.keyPoints.back().id));
+            checkInvariants(path, true);
+            QVERIFY(!path.deleteKeyPoint(123456789));
+            QCOMPARE(path.keyPoints.size(), size_t(3));
+
+            path.reduceToEnds();
+            QCOMPARE(path.keyPoints.size(), size_t(2));
+            checkInvariants(path, true);
+        }
+    }
+
+    void mediaPointsKeepTheirPlaces()
+    {
+        auto build = [](Path &path, MediaPoint &onKey, MediaPoint &onLeg) {
+            path = makePath(CurveMode::Smooth, {{0, 0}, {5, 5}, {10, 0}});
+            path.addMediaPoint(onKey, path.keyPoints[1].id, false);
+            const CurvePoint &inLeg = path.curvePoints[50];
+            onLeg = MediaPoint(inLeg.x, inLeg.y, 0);
+            path.addMediaPoint(onLeg, 0, false);
+        };
+        auto sampleOf = [](const Path &path, uint32_t mediaId) {
+            for (size_t i = 0; i < path.curvePoints.size(); ++i)
+                if (path.curvePoints[i].correspondingMediaPoint == mediaId)
+                    return int(i);
+            return -1;
+        };
+
+        Path path;
+        MediaPoint onKey(0, 0, 0), onLeg;
+        build(path, onKey, onLeg);
+        QCOMPARE(sampleOf(path, onLeg.id), 50);
+
+        // Moving the last key point leaves both where they are on the route.
+        double x = 12, y = -2;
+        QVERIFY(path.changeKeyPointPosition(path.keyPoints[2].id, x, y));
+        QCOMPARE(path.curvePoints[size_t(sampleOf(path, onKey.id))].correspondingKeyPoint, path.keyPoints[1].id);
+        QCOMPARE(sampleOf(path, onLeg.id), 50);
+        QCOMPARE(path.mediaPoints[1].x, path.curvePoints[50].x);
+
+        // Deleting the key point takes its media point with it.
+        QVERIFY(path.deleteKeyPoint(path.keyPoints[1].id));
+        QCOMPARE(path.mediaPointIndex(onKey.id), -1);
+        QCOMPARE(sampleOf(path, onKey.id), -1);
+        QCOMPARE(sampleOf(path, onLeg.id), 50);
+
+        // An insertion keeps positions as near as the new curve allows.
+        build(path, onKey, onLeg);
+        const CurvePoint before = path.curvePoints[50];
+        const QPointF keyPlace(path.keyPoints[1].x, path.keyPoints[1].y);
+        KeyPoint inserted(2, 4, 0);
+        path.insertKeyPoint(path.keyPoints[0].id, inserted, true);
+        const int after = sampleOf(path, onLeg.id);
+        QVERIFY(after >= 0);
+        const CurvePoint &now = path.curvePoints[size_t(after)];
+        QVERIFY(geoDistance(now.y, now.x, before.y, before.x) < 100000);
+        QCOMPARE(path.mediaPoints[1].longitude, now.x);
+        const CurvePoint &keySample = path.curvePoints[size_t(sampleOf(path, onKey.id))];
+        QCOMPARE(QPointF(keySample.x, keySample.y), keyPlace);
+
+        QVERIFY(path.changeMediaPointPosition(now.x, now.y, onLeg.id));
+        QVERIFY(!path.changeMediaPointPosition(0, 0, 424242));
+        QVERIFY(path.deleteMediaPointAndSample(onLeg.id));
+        QVERIFY(!path.deleteMediaPointAndSample(onLeg.id));
+    }
+
+    void fixedTrackEdits()
+    {
+        Path track = makeTrackPath(101);
+        const uint32_t firstId = track.keyPoints.front().id;
+        const uint32_t lastId = track.keyPoints.back().id;
+        QVERIFY(!track.deleteKeyPoint(firstId));
+        QVERIFY(!track.deleteKeyPoint(lastId));
+        QCOMPARE(track.keyPoints.size(), size_t(2));
+        QCOMPARE(track.curvePoints.size(), size_t(101));
+
+        // A key point placed on sample 40 splits the track there.
+        KeyPoint middle(track.curvePoints[40].x, 0.0, 0.0);
+        track.insertKeyPoint(firstId, middle, true);
+        QCOMPARE(track.curvePoints.size(), size_t(102));
+        QCOMPARE(track.curvePoints[41].correspondingKeyPoint, middle.id);
+        QVERIFY(track.curvePoints[41].id != track.curvePoints[40].id);
+        QCOMPARE(track.pathSegments[0].curvePoints.size(), size_t(41));
+        QCOMPARE(track.pathSegments[1].curvePoints.front().correspondingKeyPoint, middle.id);
+        checkInvariants(track, false);
+
+        // Moved beyond its neighbour it snaps to the nearest sample inside the range.
+        double x = 5.0, y = 0.3;
+        QVERIFY(track.changeKeyPointPosition(middle.id, x, y));
+        const int at = track.curvePointIndexNaming(middle.id);
+        QCOMPARE(at, 100);
+        QCOMPARE(x, track.curvePoints[size_t(at)].x);
+        QCOMPARE(y, 0.0);
+        QVERIFY(x < 1.0);
+        QCOMPARE(track.keyPoints[1].longitude, x);
+        checkInvariants(track, false);
+        QCOMPARE(track.pathSegments[1].curvePoints.front().correspondingKeyPoint, middle.id);
+        QCOMPARE(track.pathSegments[0].curvePoints.back().correspondingKeyPoint, middle.id);
+
+        // ...and back before its old place.
+        x = 0.104;
+        y = 0.0;
+        QVERIFY(track.changeKeyPointPosition(middle.id, x, y));
+        QCOMPARE(track.curvePointIndexNaming(middle.id), 11);
+        checkInvariants(track, false);
+
+        const size_t samples = track.curvePoints.size();
+        QVERIFY(track.deleteKeyPoint(middle.id));
+        QCOMPARE(track.curvePoints.size(), samples); // the track itself stays
+        QCOMPARE(namingCount(track, middle.id), 0);
+        QCOMPARE(track.pathSegments.size(), size_t(2));
+        track.update();
+        QCOMPARE(track.curvePoints.size(), samples); // never regenerated
+    }
+
+    void positionsAndLookups()
+    {
+        Path empty;
+        QCOMPARE(empty.percentToCurveIndex(0.5), -1);
+        Path path = makePath(CurveMode::Straight, {{0, 0}, {1, 1}});
+        const int n = int(path.curvePoints.size());
+        QCOMPARE(path.percentToCurveIndex(0.0), 0);
+        QCOMPARE(path.percentToCurveIndex(1.0), n - 1);
+        QCOMPARE(path.percentToCurveIndex(1.5), -1);
+        QCOMPARE(path.curvePointCountBetween(0.0, 1.0), n);
+        QCOMPARE(path.curvePointCountBetween(0.6, 0.5), -1);
+        QCOMPARE(path.curvePointCountBetween(0.5, 2.0), -1);
+
+        QCOMPARE(path.findPoint(path.keyPoints[1].id), static_cast<BasePoint *>(&path.keyPoints[1]));
+        QCOMPARE(path.findPoint(path.curvePoints[3].id), static_cast<BasePoint *>(&path.curvePoints[3]));
+        QVERIFY(!path.findPoint(0));
+        uint32_t seg = 0;
+        QCOMPARE(path.nextSegment(seg), &path.pathSegments[0]);
+        QCOMPARE(path.nextSegment(seg), &path.pathSegments[1]);
+        QVERIFY(!path.nextSegment(seg));
+
+        double smallest = 0;
+        QVERIFY(!path.hitTest(0.0, 0.0, 0.0, smallest, true)); // a tolerance of 0 never matches
+        QCOMPARE(smallest, 0.0);
+        const double toSecond = QGeoCoordinate(1, 1).distanceTo(QGeoCoordinate(1, 1.001));
+        QCOMPARE(path.hitTest(1.001, 1, toSecond * 1.01, smallest, false), static_cast<const BasePoint *>(&path.keyPoints[1]));
+        QVERIFY(std::fabs(smallest - toSecond) < 1e-6);
+        QVERIFY(!path.hitTest(1.001, 1, toSecond * 0.99, smallest, false));
+        const BasePoint *onCurve = path.hitTest(0.5, 0.5, 2000, smallest, true);
+        QVERIFY(onCurve && dynamic_cast<const CurvePoint *>(onCurve));
+        QVERIFY(!path.hitTest(0.5, 0.5, 2000, smallest, false));
+    }
+
+    void distanceMatchesQt()
+    {
+        const double cases[][4] = {{0, 0, 0, 1}, {51.5, -0.12, 48.85, 2.35}, {-33.9, 151.2, 40.7, -74.0}, {10, 179.9, 10, -179.9}};
+        for (const auto &c : cases)
+            QCOMPARE(geoDistance(c[0], c[1], c[2], c[3]), QGeoCoordinate(c[0], c[1]).distanceTo(QGeoCoordinate(c[2], c[3])));
+        QCOMPARE(geoDistance(95, 0, 0, 0), 0.0);
+    }
+
+    void correspondingIdsFromIndices()
+    {
+        Path path;
+        path.addKeyPoint(KeyPoint(0, 0, 0), false);
+        path.addKeyPoint(KeyPoint(1, 1, 0), false);
+        path.mediaPoints.emplace_back(0.5, 0.5, 0);
+        for (uint32_t i = 0; i < 4; ++i) {
+            CurvePoint c(i, i, 0);
+            c.correspondingKeyPoint = i;
+            c.correspondingMediaPoint = i == 0 ? 0u : 7u;
+            path.curvePoints.push_back(c);
+        }
+        path.pathSegments[0].curvePoints = {path.curvePoints[0], path.curvePoints[1]};
+        path.initCorrespondingObjectIds();
+        QCOMPARE(path.curvePoints[0].correspondingKeyPoint, path.keyPoints[0].id);
+        QCOMPARE(path.curvePoints[1].correspondingKeyPoint, path.keyPoints[1].id);
+        QCOMPARE(path.curvePoints[2].correspondingKeyPoint, 0u);
+        QCOMPARE(path.curvePoints[0].correspondingMediaPoint, path.mediaPoints[0].id);
+        QCOMPARE(path.curvePoints[1].correspondingMediaPoint, 0u);
+        QCOMPARE(path.pathSegments[0].curvePoints[1].correspondingKeyPoint, path.keyPoints[1].id);
+
+        path.pathSegments.pop_back();
+        QTest::ignoreMessage(QtDebugMsg, "initCorrespondingObjectIds: number of pathsegments not equal to number ob keypoints");
+        path.initCorrespondingObjectIds();
+    }
+
+    void pathModeTable()
+    {
+        QCOMPARE(PathMode::map(PathMode::Line)->curveMode, CurveMode::Straight);
+        QCOMPARE(PathMode::map(PathMode::Curve)->curveMode, CurveMode::Smooth);
+        QCOMPARE(PathMode::map(PathMode::Airplane)->curveMode, CurveMode::Arc);
+        QCOMPARE(PathMode::map(PathMode::Route)->curveMode, CurveMode::Straight);
+        QCOMPARE(PathMode::map(PathMode::Route)->drawMode, 0);
+        QCOMPARE(PathMode::map(PathMode::Line)->drawMode, 1);
+        QVERIFY(!PathMode::map(4));
+        QCOMPARE(PathMode::fromName(QStringLiteral("airplane")), PathMode::Airplane);
+        QCOMPARE(PathMode::fromName(QStringLiteral("Airplane")), -1);
+    }
+
+    void gapFillingOnLargeNumbers()
+    {
+        using CurveGenerator::fillGaps;
+        const auto filled = fillGaps({{0, 0}, {4, 2}}, {0, 0}, {4, 2});
+        // Three steps in x are added, each one unit along.
+        QCOMPARE(filled.size(), size_t(5));
+        QCOMPARE(filled[1], QPointF(1, 1));
+        QCOMPARE(filled.back(), QPointF(4, 2));
+        QCOMPARE(CurveGenerator::roundHalfAway(2.5), 3.0);
+        QCOMPARE(CurveGenerator::roundHalfAway(-2.5), -2.0);
+        QCOMPARE(CurveGenerator::roundHalfAway(-2.6), -3.0);
+        QVERIFY(fillGaps({}, {0, 0}, {1, 1}).empty());
+    }
+};
+
+QTEST_GUILESS_MAIN(TestPath)
+#include "tst_path.moc"
