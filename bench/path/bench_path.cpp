@@ -56,14 +56,13 @@ void insertKeyPoint(benchmark::State &state)
     path.update(true);
     for (auto _ : state) {
         state.PauseTiming();
-        Path copy = path;
-        const uint32_t after = copy.keyPoints[500].id;
-        const KeyPoint point((copy.keyPoints[500].x + copy.keyPoints[501].x) / 2, copy.keyPoints[500].y + 0.1, 0);
+        const uint32_t after = path.keyPoints[500].id;
+        const KeyPoint point((path.keyPoints[500].x + path.keyPoints[501].x) / 2, path.keyPoints[500].y + 0.1, 0);
         state.ResumeTiming();
-        copy.insertKeyPoint(after, point, true);
-        benchmark::DoNotOptimize(copy.curvePoints.data());
+        path.insertKeyPoint(after, point, true);
+        benchmark::DoNotOptimize(path.curvePoints.data());
         state.PauseTiming();
-        copy = Path();
+        path.deleteKeyPoint(point.id);
         state.ResumeTiming();
     }
 }

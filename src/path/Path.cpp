@@ -324,7 +324,9 @@ void Path::updateCurvePoints()
     for (const auto &leg : legs)
         total += leg.size();
     curvePoints.clear();
-    curvePoints.reserve(total);
+    // Headroom keeps the next edits from moving ten megabytes of samples again.
+    if (curvePoints.capacity() < total)
+        curvePoints.reserve(total + total / 4);
     for (size_t i = 0; i < legs.size(); ++i) {
         const CurveGenerator::Leg &leg = legs[i];
         const bool lastLeg = i + 1 == legs.size();
