@@ -1,0 +1,226 @@
+#include "animation/AnimationEventList.h"
+#include "animation/FlyInCamera.h"
+#include "animation/PlainAnimationSource.h"
+#include "animation/VisibleRegionProvider.h"
+
+#include <QTest>
+
+#include <limits>
+#include <vector>
+
+namespace {
+
+using Type = AnimationEvent::Type;
+
+class FixedMap : public VisibleRegionProvider
+{
+public:
+    bool known = true;
+    GeoRect region;
+    bool visibleRegion(GeoRect &out) const override
+    {
+        if (known)
+            out = region;
+        return known;
+    }
+};
+
+GeoRect rect(double left, double top, double right, double bottom)
+{
+    GeoRect r;
+    r.left = left;
+    r.top = top;
+    r.right = right;
+    r.bottom = bottom;
+    return r;
+}
+
+// An ordinary two-point route through the generator.
+void twoPointRoute(PlainAnimationSource &source, double lon1, double lat1, double lon2, double lat2)
+{
+    Path &path = source.paths.activeChecked();
+    path.addKeyPoint(KeyPoint(lon1, lat1, 0.0), false);
+    path.addKeyPoint(KeyPoint(lon2, lat2, 0.0), true);
+}
+
+std::vector<AnimationEvent> ofType(const AnimationEventList &list, Type type)
+{
+    std::vector<AnimationEvent> out;
+    for (const AnimationEvent &e : list.events()) {
+        if (e.type == type)
+            out.push_back(e);
+    }
+    return out;
+}
+
+} // namespace
+
+class TestCamera : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void flyInFrames()
+    {
+        PlainAnimationSource source;
+        twoPointRoute(source, 13.0, 51.0, 14.0, 51.5);
+        source.camera.zoom = 6.0; // where the fly-in starts
+        source.camera.bearing = 10.0;
+        AnimationEventList list(source);
+        QVERIFY(list.build(false, true, 12.0));
+
+        const std::vector<AnimationEvent> events = list.events();
+        const std::vector<AnimationEvent> frames = ofType(list, Type::FlyIn);
+        QCOMPARE(frames.size(), size_t(150));
+        QCOMPARE(events[1].type, Type::FlyIn);
+        for (int i = 151; i < 181; ++i) {
+            QCOMPARE(events[size_t(i)].type, Type::Pause);
+            QCOMPARE(events[size_t(i)].cKpId, 0u);
+            QCOMPARE(events[size_t(i)].pathPosition, 0u);
+            QVERIFY(!events[size_t(i)].stepAnimatedPilot);
+        }
+        QCOMPARE(frames.front().zoom, 6.0);
+        QCOMPARE(frames.back().zoom, 12.0); // exactly where the user left the camera
+        QVERIFY(qAbs(frames[75].zoom - 9.0) < 1e-9);
+        QCOMPARE(frames.front().bearing, 70.0);
+        QVERIFY(qAbs(frames[149].bearing - (10.0 + 60.0 / 150)) < 1e-9);
+        QCOMPARE(frames.front().tilt, 0.0);
+        QVERIFY(qAbs(frames[149].tilt - 54.0 * 149 / 150) < 1e-9);
+
+        QVariantMap map;
+        QVERIFY(list.event(1, map));
+        QStringList keys = map.keys();
+        keys.sort();
+        QCOMPARE(keys, (QStringList{"bearing", "index", "tilt", "type", "zoom"}));
+        QCOMPARE(map.value("type").toString(), QStringLiteral("flyin"));
+        QCOMPARE(map.value("index").toUInt(), 1u);
+
+        // Without rotation the bearing stands still.
+        source.flyIn.enableRotation = false;
+        QVERIFY(list.build(false, true, 12.0));
+        for (const AnimationEvent &e : ofType(list, Type::FlyIn))
+            QCOMPARE(e.bearing, 10.0);
+
+        // The user's own tilt is the target when there is one.
+        source.camera.tilt = 20.0;
+        QVERIFY(list.build(false, true, 12.0));
+        std::vector<AnimationEvent> tilted = ofType(list, Type::FlyIn);
+        QCOMPARE(tilted.front().tilt, 0.0);
+        QVERIFY(qAbs(tilted.back().tilt - 20.0 * 149 / 150) < 1e-9);
+
+        // Tilting off: the camera keeps the tilt it has.
+        source.flyIn.enableTilt = false;
+        QVERIFY(list.build(false, true, 12.0));
+        for (const AnimationEvent &e : ofType(list, Type::FlyIn))
+            QCOMPARE(e.tilt, 20.0);
+        source.camera.tilt = 0.0; // a flat map stays flat
+        QVERIFY(list.build(false, true, 12.0));
+        for (const AnimationEvent &e : ofType(list, Type::FlyIn))
+            QCOMPARE(e.tilt, 0.0);
+
+        // A fly-in of no length leaves only its second of standing still.
+        source.animationTiming.flyInDuration = 0;
+        QVERIFY(list.build(false, true, 12.0));
+        QCOMPARE(ofType(list, Type::FlyIn).size(), size_t(0));
+        QCOMPARE(list.events()[1].type, Type::Pause);
+        QCOMPARE(list.events()[30].type, Type::Pause);
+
+        // A fly-in asked for on a route without key points still flies.
+        PlainAnimationSource empty;
+        AnimationEventList emptyList(empty);
+        QVERIFY(emptyList.build(false, true, 10.0));
+        QCOMPARE(emptyList.count(), 1 + 150 + 30);
+        QCOMPARE(empty.eventCount, 0);
+    }
+
+    void zoomForExtent()
+    {
+        PlainAnimationSource source;
+        FixedMap map;
+        map.known = false; // the stored boundary serves: 2.443 x 0.864 degrees
+        FlyInCamera camera(source, &map);
+
+        source.camera.zoom = 10.7;
+        camera.setZoomForExtent(0.5, 0.2);
+        // 0.5 x 0.2 doubles twice to fit the view (z 8), then once more down.
+        QCOMPARE(source.camera.zoom, 7.0);
+
+        // A single point: no extent, the zoom is only truncated.
+        source.camera.zoom = 10.7;
+        camera.setZoomForExtent(0.0, 0.0);
+        QCOMPARE(source.camera.zoom, 10.0);
+
+        // A route much larger than what the map shows.
+        map.known = true;
+        map.region = rect(0.0, 10.0, 10.0, 0.0);
+        source.camera.zoom = 5.2;
+        camera.setZoomForExtent(40.0, 40.0);
+        QCOMPARE(source.camera.zoom, 6.0); // 34 halves once to 17, then 8.5 fits
+        // Narrower than the view in one direction: one step out, no halving.
+        source.camera.zoom = 5.0;
+        camera.setZoomForExtent(40.0, 5.0);
+        QCOMPARE(source.camera.zoom, 4.0);
+        QCOMPARE(camera.visibleRegion().width(), 10.0);
+
+        // An empty view can't be fitted against; nothing runs away.
+        map.region = rect(3.0, 3.0, 3.0, 3.0);
+        source.camera.zoom = 8.0;
+        camera.setZoomForExtent(1.0, 1.0);
+        QCOMPARE(source.camera.zoom, 8.0);
+        map.region = rect(0.0, 10.0, 10.0, 0.0);
+        camera.setZoomForExtent(std::numeric_limits<double>::infinity(), 1.0);
+        QCOMPARE(source.camera.zoom, 8.0);
+    }
+
+    void prepareAndRestore()
+    {
+        PlainAnimationSource source;
+        twoPointRoute(source, 12.0, 50.0, 12.5, 50.2);
+        source.camera.zoom = 11.5;
+        source.camera.bearing = 30.0;
+        source.camera.tilt = 15.0;
+        FlyInCamera camera(source); // no map: the stored boundary
+
+        // Without a fly-in the camera stays, and is saved.
+        QCOMPARE(camera.prepareFlyIn(), 11.5);
+        QCOMPARE(source.camera.zoom, 11.5);
+        QCOMPARE(FlyInCamera::savedView().zoom, 11.5);
+
+        // With it, the document's zoom moves out to the route's extent and the
+        // user's zoom is where the fly-in ends.
+        source.flyIn.enabled = true;
+        QCOMPARE(camera.prepareFlyIn(), 11.5);
+        QVERIFY(source.camera.zoom < 11.0);
+        QCOMPARE(source.camera.zoom, double(int(source.camera.zoom)));
+        AnimationEventList list(source);
+        QVERIFY(list.build(false, true, 11.5));
+        QCOMPARE(list.events()[1].zoom, source.camera.zoom);
+        QCOMPARE(list.events()[150].zoom, 11.5);
+
+        // Playback moved the camera; restoring brings back the saved view. The
+        // centre gets its geographic values back, its x and y stay.
+        source.camera.bearing = 0.0;
+        source.camera.tilt = 0.0;
+        source.camera.centre.setLongitude(1.0, true);
+        source.camera.centre.setLatitude(2.0, true);
+        camera.restoreView();
+        QCOMPARE(source.camera.zoom, 11.5);
+        QCOMPARE(source.camera.bearing, 30.0);
+        QCOMPARE(source.camera.tilt, 15.0);
+        QCOMPARE(source.camera.centre.longitude, 13.7164023);
+        QCOMPARE(source.camera.centre.latitude, 51.0541733);
+        QCOMPARE(source.camera.centre.x, 1.0);
+        QCOMPARE(source.camera.centre.y, 2.0);
+
+        // A route without curve points leaves the zoom alone.
+        PlainAnimationSource bare;
+        bare.flyIn.enabled = true;
+        bare.camera.zoom = 9.3;
+        FlyInCamera bareCamera(bare);
+        QCOMPARE(bareCamera.prepareFlyIn(), 9.3);
+        QCOMPARE(bare.camera.zoom, 9.3);
+    }
+};
+
+QTEST_GUILESS_MAIN(TestCamera)
+#include "tst_camera.moc"
