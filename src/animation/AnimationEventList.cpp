@@ -15,9 +15,9 @@ bool AnimationEventList::build(bool linear, bool flyIn, double startZoom)
     if (m_totalFrames < 0)
         updateDuration();
     BuiltEvents built;
+    built.events.swap(m_events); // reused: a rebuild before each playback needs no fresh pages
     const bool ok = EventListBuilder(m_source).build(linear, flyIn, startZoom, m_totalFrames, built);
     m_events = std::move(built.events);
-    m_events.shrink_to_fit();
     m_photos = std::move(built.photos);
     m_pilotSteps = built.pilotSteps;
     m_durationPercents = std::move(built.durationPercents);

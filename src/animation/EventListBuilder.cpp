@@ -27,7 +27,12 @@ EventListBuilder::EventListBuilder(const AnimationSource &source) : m_source(sou
 
 bool EventListBuilder::build(bool linear, bool flyIn, double startZoom, int32_t timelineFrames, BuiltEvents &out)
 {
-    out = BuiltEvents();
+    // The caller may hand in the last list's storage: clearing keeps its capacity.
+    out.events.clear();
+    out.photos.clear();
+    out.durationPercents.clear();
+    out.pilotSteps = 0;
+    out.ended = false;
     m_out = &out;
     m_mediaIndex.clear();
     m_overflow = false;
@@ -45,7 +50,8 @@ bool EventListBuilder::build(bool linear, bool flyIn, double startZoom, int32_t 
         out.ended = false;
     }
     m_out = nullptr;
-    m_curve.reset();
+    m_curve = nullptr;
+    m_scaledCurve.clear();
     return ok;
 }
 
@@ -94,19 +100,26 @@ bool EventListBuilder::walkKeyPoints(bool linear, int32_t timelineFrames)
 {
     const PathManager &paths = m_source.pathManager();
     const AnimationTiming &timing = m_source.timing();
-    m_curve = paths.curvePointsVector();
+    const Path *path = paths.active();
+    // The scaled copy equals the path's own samples at scale 1; copying tens of
+    // thousands of them is most of a build's time, so that case reads them in place.
+    if (path && paths.scale() == 1.0) {
+        m_curve = &path->curvePoints;
+    } else {
+        m_scaledCurve = paths.curvePoints();
+        m_curve = &m_scaledCurve;
+    }
     const std::vector<KeyPoint> keys = paths.keyPoints();
     if (keys.empty())
         return true;
     const std::vector<CurvePoint> &curve = *m_curve;
 
-    if (const Path *path = paths.active()) {
-        for (size_t i = 0; i < path->mediaPoints.size(); ++i)
-            m_mediaIndex.insert(path->mediaPoints[i].id, i);
-    }
+    for (size_t i = 0; i < path->mediaPoints.size(); ++i)
+        m_mediaIndex.insert(path->mediaPoints[i].id, i);
     std::vector<double> &shares = m_out->durationPercents;
     if (linear && curve.size() >= 2)
         shares = distanceShares(curve);
+    m_out->events.reserve(m_out->events.size() + estimatedEvents(keys, linear ? &shares : nullptr, timelineFrames));
 
     uint32_t p = 0;
     std::vector<size_t> mediaSamples;
@@ -186,6 +199,29 @@ bool EventListBuilder::walkKeyPoints(bool linear, int32_t timelineFrames)
     end.pathPosition = p;
     m_out->ended = true;
     return true;
+}
+
+size_t EventListBuilder::estimatedEvents(const std::vector<KeyPoint> &keys, const std::vector<double> *shares,
+                                         int32_t timelineFrames) const
+{
+    const AnimationTiming &timing = m_source.timing();
+    int64_t count = 1;
+    for (size_t i = 0; i < keys.size(); ++i) {
+        const KeyPointProperties &p = keys[i].properties;
+        // The closing step of a leg, and one more that rounding of the step size can add.
+        count += std::max(0, timing.pauseFrames(p.durationPause)) + 2;
+        if (shares && i < shares->size())
+            count += std::max<int64_t>(0, int64_t(timelineFrames * (*shares)[i]));
+        else if (i + 1 < keys.size())
+            count += std::max(0, timing.legFrames(p.durationToNextKP));
+    }
+    count += timing.keyPointAnimationFrames;
+    const FullFrameTiming fullFrame = m_source.fullFrameTiming();
+    const int64_t fade = std::max(0, timing.pauseFrames(fullFrame.fadeDuration));
+    const int64_t perPhoto = std::max<int64_t>(fade, timing.pauseFrames(fullFrame.duration) - fade);
+    for (const MediaPoint &media : m_source.pathManager().active()->mediaPoints)
+        count += media.properties.imageSources.size() * perPhoto + fade;
+    return size_t(std::min<int64_t>(count, int64_t(maxEvents)));
 }
 
 bool EventListBuilder::buildMedia(uint32_t mediaPointId, uint32_t position, int32_t stepping)

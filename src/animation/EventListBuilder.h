@@ -6,7 +6,6 @@
 
 #include <QHash>
 
-#include <memory>
 #include <vector>
 
 class MediaPoint;
@@ -39,6 +38,9 @@ public:
 private:
     bool appendFlyIn(double startZoom);
     bool walkKeyPoints(bool linear, int32_t timelineFrames);
+    // Room for the events of the key point walk, so that the list grows once.
+    size_t estimatedEvents(const std::vector<KeyPoint> &keys, const std::vector<double> *shares, int32_t timelineFrames) const;
+    // False when the media point doesn't exist, or the list is full.
     bool buildMedia(uint32_t mediaPointId, uint32_t position, int32_t stepping);
     bool appendFade(AnimationEvent::Transition transition, int32_t fade, uint32_t photo, uint32_t position);
     bool appendRun(AnimationEvent::Type type, int64_t count, uint32_t cKpId, uint32_t position, int32_t stepping);
@@ -50,7 +52,8 @@ private:
 
     const AnimationSource &m_source;
     BuiltEvents *m_out = nullptr;
-    std::shared_ptr<const std::vector<CurvePoint>> m_curve;
+    const std::vector<CurvePoint> *m_curve = nullptr;
+    std::vector<CurvePoint> m_scaledCurve;
     AvatarStepping m_stepping;
     QHash<uint32_t, size_t> m_mediaIndex;
     bool m_overflow = false;
