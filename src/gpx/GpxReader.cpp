@@ -77,9 +77,15 @@ void GpxReader::readRoute()
 
 void GpxReader::readPoint()
 {
-    const QXmlStreamAttributes attributes = m_xml.attributes();
-    const double longitude = attributes.value(QLatin1String("lon")).toDouble();
-    const double latitude = attributes.value(QLatin1String("lat")).toDouble();
+    double longitude;
+    double latitude;
+    {
+        // Released before the children are read, so that the reader's own attribute
+        // list isn't shared and copied at the next element.
+        const QXmlStreamAttributes attributes = m_xml.attributes();
+        longitude = attributes.value(QLatin1String("lon")).toDouble();
+        latitude = attributes.value(QLatin1String("lat")).toDouble();
+    }
     double elevation = -1.0;
     QString name;
     while (m_xml.readNextStartElement()) {

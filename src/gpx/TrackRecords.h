@@ -15,6 +15,7 @@ struct TrackPoint
     bool hasAltitude = false; // the file gave an elevation (which may itself be 0)
     QString name;             // also the point's title; empty for plain track points
 };
+Q_DECLARE_TYPEINFO(TrackPoint, Q_MOVABLE_TYPE);
 
 // The extent of an item's points. A side of exactly 0 counts as unset and is taken
 // by the next point, so an all-zero value means nothing has been seen.
