@@ -47,6 +47,24 @@ bool writeTrack(const QString &fileName)
     return file.write(chunk) == chunk.size();
 }
 
+// The same track as one KML line string, the shape in which mapping tools export it.
+bool writeKmlTrack(const QString &fileName)
+{
+    QFile file(fileName);
+    if (!file.open(QIODevice::WriteOnly | QIODevice::Truncate))
+        return false;
+    QByteArray chunk = "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<kml xmlns=\"http://www.opengis.net/kml/2.2\">"
+                       "<Document><Placemark><name>Long day</name><LineString><coordinates>\n";
+    char tuple[80];
+    for (int i = 0; i < pointCount; ++i) {
+        std::snprintf(tuple, sizeof tuple, "%.7f,%.7f,%.1f\n", 7.0 + i * 0.0000171, 46.0 + i * 0.0000123,
+                      400.0 + (i % 3000) * 0.1);
+        chunk += tuple;
+    }
+    chunk += "</coordinates></LineString></Placemark></Document></kml>\n";
+    return file.write(chunk) == chunk.size();
+}
+
 long peakRssKiB()
 {
     rusage usage{};
@@ -83,6 +101,29 @@ void BM_ReadLargeGpx(benchmark::State &state)
     state.SetBytesProcessed(int64_t(state.iterations()) * QFile(fileName).size());
 }
 BENCHMARK(BM_ReadLargeGpx)->Unit(benchmark::kMillisecond)->Iterations(5);
+
+void BM_ReadLargeKml(benchmark::State &state)
+{
+    QTemporaryDir folder;
+    const QString fileName = folder.filePath(QStringLiteral("long.kml"));
+    if (!writeKmlTrack(fileName)) {
+        state.SkipWithError("cannot write the track file");
+        return;
+    }
+    int points = 0;
+    for (auto _ : state) {
+        TrackFile file;
+        if (!file.load(fileName)) {
+            state.SkipWithError("read failed");
+            return;
+        }
+        points = file.items()[size_t(file.selectItem())].points.size();
+        benchmark::DoNotOptimize(points);
+    }
+    state.counters["points"] = points;
+    state.SetBytesProcessed(int64_t(state.iterations()) * QFile(fileName).size());
+}
+BENCHMARK(BM_ReadLargeKml)->Unit(benchmark::kMillisecond)->Iterations(3);
 
 } // namespace
 

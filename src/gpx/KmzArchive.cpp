@@ -78,6 +78,7 @@ bool KmzArchive::extract(const QString &archiveFileName, const QString &folder)
 
     const QString root = QDir::cleanPath(folder);
     std::vector<char> buffer(bufferSize);
+    uint64_t total = 0;
     const zip_int64_t count = zip_get_num_entries(archive.get(), 0);
     for (zip_int64_t index = 0; index < count; ++index) {
         zip_stat_t stat;
@@ -88,6 +89,9 @@ bool KmzArchive::extract(const QString &archiveFileName, const QString &folder)
             return false;
         const QString name = QString::fromUtf8(stat.name);
         if (!isSafeEntryName(name) || stat.size > maxEntrySize)
+            return false;
+        total += stat.size;
+        if (total > maxTotalSize)
             return false;
         const QString target = root + QLatin1Char('/') + name;
         if (!QDir::cleanPath(target).startsWith(root + QLatin1Char('/')) && QDir::cleanPath(target) != root)

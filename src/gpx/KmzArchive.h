@@ -11,6 +11,9 @@ class KmzArchive
 {
 public:
     static constexpr uint64_t maxEntrySize = uint64_t(512) * 1024 * 1024;
+    // Many entries just under the limit would still fill the disk: the entry that
+    // takes the sum above this fails too.
+    static constexpr uint64_t maxTotalSize = uint64_t(2048) * 1024 * 1024;
 
     // Entries of size 0 become folders, all others files. Returns false when the archive
     // can't be opened or an entry failed; what was written before stays in the folder.

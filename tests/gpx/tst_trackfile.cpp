@@ -2,6 +2,7 @@
 
 #include <QBuffer>
 #include <QDir>
+#include <QElapsedTimer>
 #include <QFile>
 #include <QTemporaryDir>
 #include <QTest>
@@ -222,6 +223,33 @@ private slots:
         // Data after the document and a second root are ignored.
         QVERIFY(file.load(write("tail.gpx", whole + "<gpx><trk><trkseg>" + trkpt(9, 9) + "</trkseg></trk></gpx>")));
         QCOMPARE(file.items()[0].points.size(), 3);
+    }
+
+    void hostileDocumentsEndQuickly()
+    {
+        TrackFile file;
+        // Nested entities that would expand to gigabytes are refused by the reader.
+        QByteArray laughs = "<?xml version=\"1.0\"?>\n<!DOCTYPE gpx [\n<!ENTITY a0 \"1.5\">\n";
+        for (int i = 1; i < 10; ++i)
+            laughs += "<!ENTITY a" + QByteArray::number(i) + " \"" + QByteArray("&a" + QByteArray::number(i - 1) + ";").repeated(10) + "\">\n";
+        laughs += "]>\n" + gpx(trk(trkpt(1, 1) + trkpt(2, 2, "<ele>&a9;</ele>") + trkpt(3, 3))).mid(39);
+        QElapsedTimer timer;
+        timer.start();
+        file.load(write("laughs.gpx", laughs));
+        QVERIFY(timer.elapsed() < 5000);
+        QVERIFY(file.items().empty() || file.items()[0].points.size() <= 3);
+
+        // Deep nesting of unknown elements inside a point, and an unclosed flood of them.
+        const QByteArray deep = QByteArray("<x>").repeated(200000) + QByteArray("</x>").repeated(200000);
+        QVERIFY(file.load(write("deep.gpx", gpx(trk(trkpt(1, 1, deep) + trkpt(2, 2))))));
+        QCOMPARE(file.items()[0].points.size(), 2);
+        QVERIFY(!file.load(write("flood.kml", "<kml><Document>" + QByteArray("<Folder>").repeated(200000))));
+
+        // Extreme numbers are kept as numbers; only infinite ones are refused.
+        QVERIFY(file.load(write("extreme.gpx", gpx(trk(trkpt(1, 1, "<ele>1e308</ele>") + "<trkpt lat=\"1e-320\" lon=\"-1.7976931348623157e308\"/>")))));
+        QCOMPARE(file.items()[0].points.size(), 2);
+        QCOMPARE(file.items()[0].points[0].altitude, 1e308);
+        QCOMPARE(file.items()[0].bounds.left, -1.7976931348623157e308);
     }
 
     void kmlScopesAndShapes()
