@@ -18,6 +18,11 @@ bool TrackFile::load(const QString &fileName)
         logTrace(0, QStringLiteral("File open error: %s"), file.errorString());
         return false;
     }
+    // A pipe or device could deliver data without end.
+    if (file.isSequential()) {
+        logTrace(0, QStringLiteral("File open error: %s"), QStringLiteral("not a regular file"));
+        return false;
+    }
 
     const QString suffix = QFileInfo(fileName).suffix();
     if (suffix == QLatin1String("kmz")) {

@@ -91,6 +91,8 @@ private slots:
         QVERIFY(!none.load(write("other.gpx", "<?xml version=\"1.0\"?><html><trk/></html>")));
         QVERIFY(!none.load(m_dir.filePath("missing.gpx")));
         QVERIFY(!none.load(write("empty.gpx", QByteArray())));
+        QVERIFY(!none.load(QStringLiteral("/dev/zero"))); // endless data: refused, not read
+        QVERIFY(!none.load(m_dir.path()));
         QVERIFY(!none.load(write("blank.gpx", "  \r\n\n ")));
         QVERIFY(!none.load(write("binary.gpx", QByteArray("\x00\x01\xff\xfe garbage", 14))));
     }
