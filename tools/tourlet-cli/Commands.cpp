@@ -4,5 +4,6 @@ std::vector<CliCommand> allCommands()
 {
     std::vector<CliCommand> commands;
     commands.push_back(curveCommand());
+    commands.push_back(trackCommand());
     return commands;
 }

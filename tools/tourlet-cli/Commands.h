@@ -8,3 +8,4 @@
 std::vector<CliCommand> allCommands();
 
 CliCommand curveCommand();
+CliCommand trackCommand();
