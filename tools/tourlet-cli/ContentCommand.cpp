@@ -2,6 +2,7 @@
 
 #include "content/ContentCatalogue.h"
 
+#include <QDir>
 #include <QFileInfo>
 #include <QJsonArray>
 #include <QJsonObject>
@@ -110,6 +111,10 @@ int runContent(QStringList args)
     if (!ok)
         return cli::fail(QStringLiteral("content: --language needs a number, not '%1'").arg(language));
 
+    // The catalogue keeps paths as given, and item maps make file URLs of them.
+    imageRoot = QDir::cleanPath(QFileInfo(imageRoot).absoluteFilePath()) + QLatin1Char('/');
+    if (!dataFolder.isEmpty())
+        dataFolder = QDir::cleanPath(QFileInfo(dataFolder).absoluteFilePath());
     ContentCatalogue catalogue;
     catalogue.load(imageRoot, dataFolder, languageIndex);
     cli::printJson({{QStringLiteral("imageRoot"), catalogue.imageRoot()},
