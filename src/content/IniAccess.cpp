@@ -24,6 +24,22 @@ struct ReadCache
 
 thread_local ReadCache *activeCache = nullptr;
 
+// Content ini files are small; anything else under such a name (a folder, a pipe,
+// a huge file) is taken as unreadable rather than read.
+constexpr qint64 maxIniFileSize = 16 * 1024 * 1024;
+
+bool isReadableIni(const QString &file)
+{
+    const QFileInfo info(file);
+    if (!info.isFile())
+        return false;
+    if (info.size() > maxIniFileSize) {
+        logTrace(3, QStringLiteral("readIniValue: %s is too large for an ini file"), file);
+        return false;
+    }
+    return true;
+}
+
 std::shared_ptr<const QSettings::SettingsMap> readContentIniFile(const QString &file)
 {
     if (activeCache) {
@@ -33,7 +49,7 @@ std::shared_ptr<const QSettings::SettingsMap> readContentIniFile(const QString &
     }
     std::shared_ptr<QSettings::SettingsMap> map;
     QFile f(file);
-    if (f.open(QIODevice::ReadOnly)) {
+    if (isReadableIni(file) && f.open(QIODevice::ReadOnly)) {
         map = std::make_shared<QSettings::SettingsMap>();
         ContentIni::parse(f.readAll(), *map);
     }
@@ -47,12 +63,17 @@ QVariant readPlatformIni(const QString &file, const QString &address)
     if (activeCache) {
         auto hit = activeCache->platformIni.find(file);
         if (hit == activeCache->platformIni.end()) {
-            auto settings = std::make_shared<QSettings>(file, QSettings::IniFormat);
-            settings->setIniCodec("UTF-8");
+            std::shared_ptr<QSettings> settings;
+            if (isReadableIni(file)) {
+                settings = std::make_shared<QSettings>(file, QSettings::IniFormat);
+                settings->setIniCodec("UTF-8");
+            }
             hit = activeCache->platformIni.insert(file, settings);
         }
-        return hit.value()->value(address);
+        return hit.value() ? hit.value()->value(address) : QVariant();
     }
+    if (!isReadableIni(file))
+        return QVariant();
     QSettings settings(file, QSettings::IniFormat);
     settings.setIniCodec("UTF-8");
     return settings.value(address);
@@ -122,8 +143,6 @@ QString readIniValue(const QString &file, const QString &section, const QString 
         const auto hit = map->constFind(ContentIni::lookupKey(section, key));
         return hit == map->constEnd() ? defaultValue : hit.value().toString();
     }
-    if (!activeCache && !QFileInfo::exists(file))
-        return defaultValue;
     const QVariant value = readPlatformIni(file, address(section, key));
     return value.isValid() ? value.toString() : defaultValue;
 }
@@ -133,7 +152,7 @@ QStringList readIniList(const QString &file, const QString &section, const QStri
 {
     if (useContentIni)
         return splitTrimmed(readIniValue(file, section, key, true), delimiter);
-    if (file.isEmpty() || (!activeCache && !QFileInfo::exists(file)))
+    if (file.isEmpty())
         return {};
     // The platform format has already split at commas.
     QStringList out;

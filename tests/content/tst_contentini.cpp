@@ -7,6 +7,8 @@
 #include <QTemporaryDir>
 #include <QTest>
 
+#include <sys/stat.h>
+
 class TestContentIni : public QObject
 {
     Q_OBJECT
@@ -137,6 +139,23 @@ private slots:
             QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("type"), false, QStringLiteral("d")),
                      QStringLiteral("d"));
         }
+        // Things that are no small regular file are not read at all.
+        const QString folder = path(QStringLiteral("folder.ini"));
+        QVERIFY(QDir().mkpath(folder));
+        const QString fifo = path(QStringLiteral("pipe.ini"));
+        QCOMPARE(::mkfifo(QFile::encodeName(fifo).constData(), 0600), 0);
+        const QString huge = path(QStringLiteral("huge.ini"));
+        QVERIFY(writeFile(huge, "[main]\ntype=png\n" + QByteArray(17 * 1024 * 1024, '\n')));
+        for (const QString &file : {folder, fifo, huge}) {
+            for (bool contentIni : {true, false}) {
+                QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("type"), contentIni, QStringLiteral("d")),
+                         QStringLiteral("d"));
+                IniReadCache cache;
+                QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("type"), contentIni, QStringLiteral("d")),
+                         QStringLiteral("d"));
+            }
+        }
+
         QSettings::SettingsMap map;
         ContentIni::parse(QByteArray(200000, 'x') + "=" + QByteArray(200000, ' ') + "y", map);
         QCOMPARE(map.size(), 1);
