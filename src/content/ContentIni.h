@@ -12,7 +12,10 @@ namespace ContentIni {
 // The format handle, registered with QSettings on first use under the "ini"
 // extension with case-insensitive keys. Writing through it always fails.
 // Keys are stored lower-cased, and QSettings on Linux compares keys as given,
-// so look them up lower-cased there (readIniValue does so itself).
+// so look them up lower-cased there (readIniValue does so itself). QSettings also
+// keeps one parse per file path whatever the format, so a file that was read as
+// QSettings::IniFormat in this process may come back parsed that way: readIniValue
+// parses content files itself and is the safer road.
 QSettings::Format format();
 
 // Parses the text of one file into map. Never fails: lines that are neither a

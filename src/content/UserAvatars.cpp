@@ -10,6 +10,7 @@
 
 #include <zip.h>
 
+#include <limits>
 #include <memory>
 #include <vector>
 
@@ -113,6 +114,8 @@ bool listEntries(zip_t *archive, uint64_t maxEntrySize, std::vector<ZipEntry> &e
 
 bool writeEntry(zip_t *archive, const ZipEntry &entry, const QString &target)
 {
+    if (entry.size >= zip_uint64_t(std::numeric_limits<int>::max()))
+        return false;
     std::unique_ptr<zip_file_t, ZipFileCloser> in(zip_fopen_index(archive, entry.index, 0));
     if (!in)
         return false;
@@ -161,7 +164,8 @@ QString freeTargetFolder(const QString &parent, const QString &baseName)
     if (!QFileInfo::exists(first))
         return first;
     for (int n = 1;; ++n) {
-        const QString next = QStringLiteral("%1/u3d_%2(%3)").arg(parent, baseName).arg(n);
+        // Joined by hand: the names may hold "%1" themselves.
+        const QString next = first + QLatin1Char('(') + QString::number(n) + QLatin1Char(')');
         if (!QFileInfo::exists(next))
             return next;
     }

@@ -92,6 +92,8 @@ private slots:
                  QStringList({QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("c")}));
         QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("list"), QStringLiteral(","), true),
                  QStringList({QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("c")}));
+        // QSettings shares one parse per path between formats; the content reads must not see it.
+        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("quoted")), QStringLiteral("\"quoted\""));
         QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("mixed"), QStringLiteral(";"), true),
                  QStringList({QStringLiteral("one"), QStringLiteral("two, \"three\" 'four' C:\\dir\\file.png")}));
     }

@@ -158,6 +158,14 @@ private slots:
 
         const QString good = path(QStringLiteral("good.zip"));
         QVERIFY(writeZip(good, {{"g_1.png", "x"}}));
+        // Names that look like format markers stay as they are.
+        const QString percent = path(QStringLiteral("p%1.zip"));
+        QVERIFY(QFile::copy(good, percent));
+        QVERIFY(importZipAvatar(data, percent, picture));
+        QVERIFY(importZipAvatar(data, percent, picture));
+        QCOMPARE(picture, data + QStringLiteral("/userAvatars/u3d_p%1(1)/ZK3D/u3d_p%1(1)/u3d_p%1(1)_1.png"));
+        QVERIFY(QFileInfo::exists(picture));
+
         QVERIFY(!importZipAvatar(QString(), good, picture));
         QCOMPARE(importErrorNumber(), 3u);
         QVERIFY(!importZipAvatar(path(QStringLiteral("no/such/data")), good, picture));
