@@ -5,5 +5,6 @@ std::vector<CliCommand> allCommands()
     std::vector<CliCommand> commands;
     commands.push_back(curveCommand());
     commands.push_back(trackCommand());
+    commands.push_back(contentCommand());
     return commands;
 }

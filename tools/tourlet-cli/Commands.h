@@ -9,3 +9,4 @@ std::vector<CliCommand> allCommands();
 
 CliCommand curveCommand();
 CliCommand trackCommand();
+CliCommand contentCommand();
