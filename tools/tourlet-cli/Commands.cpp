@@ -3,5 +3,6 @@
 std::vector<CliCommand> allCommands()
 {
     std::vector<CliCommand> commands;
+    commands.push_back(encodeCommand());
     return commands;
 }

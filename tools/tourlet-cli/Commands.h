@@ -6,3 +6,5 @@
 
 // Every subcommand, in the order --help lists them. Each lives in its own file.
 std::vector<CliCommand> allCommands();
+
+CliCommand encodeCommand();
