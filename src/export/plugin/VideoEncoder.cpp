@@ -101,9 +101,11 @@ bool VideoEncoder::setUp()
                               int(p.targetHeight), AV_PIX_FMT_YUV420P, SWS_BICUBIC, nullptr, nullptr, nullptr);
     if (!m_scaler)
         return false;
-    // Full-range RGB in, limited-range BT.709 out, as the stream is tagged.
-    sws_setColorspaceDetails(m_scaler, sws_getCoefficients(SWS_CS_DEFAULT), 1, sws_getCoefficients(SWS_CS_ITU709),
-                             0, 0, 1 << 16, 1 << 16);
+    // Full-range RGB in, limited range out: BT.709 for H.264, which is tagged so;
+    // WMV can't carry the tag and is read as BT.601, the matrix it gets.
+    const int matrix = m_format == VidcoreFormatMp4 ? SWS_CS_ITU709 : SWS_CS_ITU601;
+    sws_setColorspaceDetails(m_scaler, sws_getCoefficients(SWS_CS_DEFAULT), 1, sws_getCoefficients(matrix), 0, 0,
+                             1 << 16, 1 << 16);
 
     m_frame = av_frame_alloc();
     m_packet = av_packet_alloc();
@@ -140,9 +142,11 @@ bool VideoEncoder::configureCodec()
                                                : std::max(1, int(std::lround(2.0 * p.targetFrameRate)));
     m_codec->thread_count = int(p.threadCount); // 0: the codec picks by core count
     m_codec->color_range = AVCOL_RANGE_MPEG;
-    m_codec->colorspace = AVCOL_SPC_BT709;
-    m_codec->color_primaries = AVCOL_PRI_BT709;
-    m_codec->color_trc = AVCOL_TRC_BT709;
+    if (mp4) {
+        m_codec->colorspace = AVCOL_SPC_BT709;
+        m_codec->color_primaries = AVCOL_PRI_BT709;
+        m_codec->color_trc = AVCOL_TRC_BT709;
+    }
     if (mp4 && m_codec->priv_data)
         av_opt_set(m_codec->priv_data, "preset", X264Preset, 0);
     if (m_container->oformat->flags & AVFMT_GLOBALHEADER)
