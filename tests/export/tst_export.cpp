@@ -215,8 +215,9 @@ private slots:
         QVERIFY(ExportWorker::exportSize(-5).isEmpty());
 
         // The height argument plays no part; the encoder gets the derived size.
-        const QString file = path(QStringLiteral("size.mp4"));
+        const QString file = path(QStringLiteral("größe 1000.mp4"));
         QVERIFY(exportFilm(file, true, 3, QSize(1000, 123), fill));
+        QVERIFY(QFile::exists(file));
         const Probe p = probe(file);
         QCOMPARE(p.width, 992);
         QCOMPARE(p.height, 558);
