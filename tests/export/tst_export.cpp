@@ -2,6 +2,7 @@
 #include "export/ExportWorker.h"
 #include "export/QGrabWidgetFrame.h"
 #include "export/VideoComment.h"
+#include "export/VidcoreInterface.h"
 
 #include <QDir>
 #include <QFile>
@@ -16,7 +17,9 @@
 #include <QTest>
 #include <QThread>
 
+#include <cmath>
 #include <functional>
+#include <string>
 
 namespace {
 
@@ -413,6 +416,60 @@ private slots:
         QVERIFY(!VideoComment::write(text, QStringLiteral("x")));
         QVERIFY(f.open(QIODevice::ReadOnly));
         QCOMPARE(f.readAll(), QByteArray("not a film"));
+    }
+
+    void libraryRefusesBadInput()
+    {
+        EncoderLibrary::release();
+        QVERIFY(EncoderLibrary::load());
+        auto create = reinterpret_cast<VidcoreCreateExport>(EncoderLibrary::resolve("CreateExport"));
+        auto extension = reinterpret_cast<VidcoreDefaultExtension>(EncoderLibrary::resolve("DefaultExtension"));
+        QVERIFY(create && extension);
+        QVERIFY(!create(3));
+        QCOMPARE(QString::fromWCharArray(extension(3)), QString());
+
+        VidcoreExport *encoder = create(VidcoreFormatMp4);
+        QVERIFY(encoder);
+        const VidcoreOperations &op = *encoder->operations;
+        VidcoreParameters record;
+        op.getParameters(encoder, &record);
+        QCOMPARE(record.bitRate, 40000000);
+        QCOMPARE(record.targetFrameRate, 30.0);
+
+        const QString file = path(QStringLiteral("direct.mp4"));
+        const std::wstring name = file.toStdWString();
+        const auto openWith = [&](uint32_t w, uint32_t h, double rate) {
+            VidcoreParameters r = record;
+            r.sourceWidth = r.targetWidth = w;
+            r.sourceHeight = r.targetHeight = h;
+            r.sourceFrameRate = r.targetFrameRate = rate;
+            return op.open(encoder, name.c_str(), &r);
+        };
+        QVERIFY(!openWith(321, 180, 30.0));
+        QVERIFY(!openWith(320, 0, 30.0));
+        QVERIFY(!openWith(320, 180, 0.0));
+        QVERIFY(!openWith(320, 180, std::nan("")));
+        QVERIFY(!QFile::exists(file));
+        QVERIFY(!op.open(encoder, nullptr, &record));
+
+        QVERIFY(openWith(320, 180, 25.0));
+        QVERIFY(!openWith(320, 180, 25.0)); // open already
+        QImage frame(320, 180, QImage::Format_RGB32);
+        frame.fill(Qt::gray);
+        op.writeFrame(encoder, frame.constBits(), uint32_t(frame.sizeInBytes()) - 4, VidcoreNextFrame); // short: dropped
+        op.writeFrame(encoder, nullptr, uint32_t(frame.sizeInBytes()), VidcoreNextFrame);
+        op.writeFrame(encoder, frame.constBits(), uint32_t(frame.sizeInBytes()), VidcoreNextFrame);
+        op.writeFrame(encoder, frame.constBits(), uint32_t(frame.sizeInBytes()), 0); // behind: taken as next
+        op.finish(encoder);
+        op.writeFrame(encoder, frame.constBits(), uint32_t(frame.sizeInBytes()), VidcoreNextFrame); // after the end
+        op.finish(encoder);
+        op.close(encoder);
+        op.close(encoder);
+        EncoderLibrary::release();
+
+        const Probe p = probe(file);
+        QCOMPARE(p.frames, 2);
+        QCOMPARE(p.frameRate, QStringLiteral("25/1"));
     }
 
     void frameDumpsArePngs()
