@@ -91,14 +91,18 @@ void ExportWorker::exportNextFrame(int frameNumber, QImage *frame)
     m_export->operations->getParameters(m_export, &record);
     logTrace(0, "orig frame: %d, %d, %d", frame->width(), frame->height(), qint64(frame->sizeInBytes()));
 
-    QImage picture = frame->scaled(int(record.targetWidth), int(record.targetHeight), Qt::IgnoreAspectRatio,
-                                   Qt::SmoothTransformation);
-    if (picture.format() != QImage::Format_RGB32)
-        picture = picture.convertToFormat(QImage::Format_RGB32);
-    logTrace(0, "export frame: %d, %d, %d", picture.width(), picture.height(), qint64(picture.sizeInBytes()));
+    {
+        // At the target size already, this is a shallow copy of the caller's frame. It must
+        // be gone before frameExportFinished, or the next paint into the frame would detach it.
+        QImage picture = frame->scaled(int(record.targetWidth), int(record.targetHeight), Qt::IgnoreAspectRatio,
+                                       Qt::SmoothTransformation);
+        if (picture.format() != QImage::Format_RGB32)
+            picture = picture.convertToFormat(QImage::Format_RGB32);
+        logTrace(0, "export frame: %d, %d, %d", picture.width(), picture.height(), qint64(picture.sizeInBytes()));
 
-    m_export->operations->writeFrame(m_export, picture.constBits(), uint32_t(picture.sizeInBytes()),
-                                     VidcoreNextFrame);
+        m_export->operations->writeFrame(m_export, picture.constBits(), uint32_t(picture.sizeInBytes()),
+                                         VidcoreNextFrame);
+    }
     logTrace(0, "ExportWorker::exportNextFrame:end %d", frameNumber);
     emit frameExportFinished();
 }
