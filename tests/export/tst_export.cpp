@@ -327,10 +327,15 @@ private slots:
         QVERIFY(first.hasEncoder());
 
         QImage frame(320, 180, QImage::Format_RGB32);
+        // When the frame is handed back the worker holds no copy of it, so that the next
+        // picture is painted in place instead of into a fresh buffer.
+        int sharedOnReturn = 0;
+        connect(&first, &ExportWorker::frameExportFinished, this, [&] { sharedOnReturn += frame.isDetached() ? 0 : 1; });
         for (int i = 0; i < 5; ++i) {
             fill(i, frame);
             first.exportNextFrame(i, &frame);
         }
+        QCOMPARE(sharedOnReturn, 0);
         QSignalSpy finalized(&first, &ExportWorker::finalized);
         first.finalizeExport();
         QCOMPARE(finalized.count(), 1);
