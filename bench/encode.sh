@@ -9,7 +9,7 @@ set -euo pipefail
 build=${BUILD_DIR:-build}
 cli="$build/bin/tourlet-cli"
 frames=${FRAMES:-300}
-runs=${RUNS:-3}
+runs=${RUNS:-5}
 size=1920x1080
 
 [ -x "$cli" ] || { echo "encode.sh: $cli is not built" >&2; exit 1; }
