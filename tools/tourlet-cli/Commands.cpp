@@ -6,5 +6,6 @@ std::vector<CliCommand> allCommands()
     commands.push_back(curveCommand());
     commands.push_back(trackCommand());
     commands.push_back(contentCommand());
+    commands.push_back(encodeCommand());
     return commands;
 }

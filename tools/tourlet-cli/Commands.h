@@ -10,3 +10,4 @@ std::vector<CliCommand> allCommands();
 CliCommand curveCommand();
 CliCommand trackCommand();
 CliCommand contentCommand();
+CliCommand encodeCommand();
