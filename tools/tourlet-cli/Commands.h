@@ -8,3 +8,6 @@
 std::vector<CliCommand> allCommands();
 
 CliCommand curveCommand();
+CliCommand trackCommand();
+CliCommand contentCommand();
+CliCommand encodeCommand();
