@@ -420,6 +420,80 @@ private slots:
         QCOMPARE(countByType(list).at(Type::Pause), 15 + 30 + 30);
     }
 
+    void photographsWithinOneStepAndOnRepeatedPositions()
+    {
+        // 300 samples in 30 frames: each step jumps 10 samples, so the media points on
+        // samples 41 and 47 are both passed by the same step and must both show, in
+        // route order, each once.
+        PlainAnimationSource source;
+        layRoute(source, {0.0, 1.0}, 300);
+        source.paths.activeChecked().keyPoints[0].properties.durationToNextKP = 1000;
+        placeMedia(source, 47, {QStringLiteral("/p/second.jpg")});
+        placeMedia(source, 41, {QStringLiteral("/p/first.jpg")});
+        placeMedia(source, 60, {}); // a media point without photographs shows nothing
+        AnimationEventList list(source);
+        pinStretch(source, list);
+        QVERIFY(list.build(false, false, 10.0));
+        QStringList shown;
+        uint32_t position = 0;
+        for (const AnimationEvent &e : list.events()) {
+            if (e.type == Type::MediaPoint && e.mpePosition == AnimationEvent::MpePosition::FirstEvent) {
+                shown << list.photo(e).file;
+                position = e.pathPosition;
+            }
+        }
+        QCOMPARE(shown, (QStringList{"/p/first.jpg", "/p/second.jpg"}));
+        QCOMPARE(position, 40u); // where the avatar stood when the step passed them
+        QCOMPARE(countByType(list).at(Type::MediaPoint), 2 * 30);
+        QCOMPARE(countByType(list).at(Type::Step), 31);
+
+        // 30 samples in 300 frames: the avatar stands on each sample ten times, and
+        // the photograph on sample 12 still shows once.
+        PlainAnimationSource slow;
+        layRoute(slow, {0.0, 1.0}, 30);
+        slow.paths.activeChecked().keyPoints[0].properties.durationToNextKP = 10000;
+        placeMedia(slow, 12, {QStringLiteral("/p/once.jpg")});
+        AnimationEventList slowList(slow);
+        pinStretch(slow, slowList);
+        QVERIFY(slowList.build(false, false, 10.0));
+        const auto counts = countByType(slowList);
+        QCOMPARE(counts.at(Type::MediaPoint), 30);
+        QCOMPARE(counts.at(Type::Step), 301);
+        // Shown where the step that passed sample 12 started.
+        const std::vector<AnimationEvent> &events = slowList.events();
+        size_t first = 0;
+        while (events[first].type != Type::MediaPoint)
+            ++first;
+        const uint32_t at = events[first - 1].pathPosition;
+        QVERIFY2(at == 11 || at == 12, qPrintable(QString::number(at)));
+        for (const AnimationEvent &e : events) {
+            if (e.type == Type::MediaPoint)
+                QCOMPARE(e.pathPosition, at);
+        }
+    }
+
+    void scaledRoute()
+    {
+        // A scaled path is read through its scaled copy; on the equator halving the
+        // longitudes keeps every leg's share, and the walk finds the same samples.
+        PlainAnimationSource plain;
+        layRoute(plain, {0.0, 1.0, 4.0, 4.5}, 40);
+        AnimationEventList plainList(plain);
+        QVERIFY(plainList.build(true, false, 10.0));
+
+        PlainAnimationSource scaled;
+        layRoute(scaled, {0.0, 1.0, 4.0, 4.5}, 40);
+        scaled.paths.setScale(0.5);
+        QCOMPARE(scaled.paths.scale(), 0.5);
+        AnimationEventList scaledList(scaled);
+        QVERIFY(scaledList.build(true, false, 10.0));
+        QCOMPARE(scaledList.durationPercents().size(), size_t(3));
+        for (size_t i = 0; i < 3; ++i)
+            QVERIFY(qAbs(scaledList.durationPercents()[i] - plainList.durationPercents()[i]) < 1e-9);
+        QCOMPARE(scaledList.count(), plainList.count());
+        QCOMPARE(scaledList.events().back().pathPosition, 120u);
+    }
+
     void animatedAvatarStepping()
     {
         QTemporaryDir dir;
