@@ -13,6 +13,13 @@ bool TrackImport::read(const QString &fileName, Path &outPath, uint32_t aliasing
     const int chosen = track.selectItem();
     if (chosen < 0)
         return false;
+    toPath(track, chosen, outPath, aliasing, fixedDurationSamples);
+    return true;
+}
+
+void TrackImport::toPath(const TrackFile &track, int chosen, Path &outPath, uint32_t aliasing,
+                         int32_t fixedDurationSamples)
+{
     const TrackItem &item = track.items()[size_t(chosen)];
 
     Path path;
@@ -42,5 +49,4 @@ bool TrackImport::read(const QString &fileName, Path &outPath, uint32_t aliasing
     // tolerance of 0, which never matches: they leave the route as it is.
     path.setBoundaries(topLeft, bottomRight);
     outPath = std::move(path);
-    return true;
 }
