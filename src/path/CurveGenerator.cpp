@@ -185,8 +185,11 @@ Leg fillGaps(const Leg &samples, const QPointF &a, const QPointF &b)
 {
     if (samples.empty())
         return {};
-    if (!(std::fabs(a.x() - b.x()) <= widestLeg && std::fabs(a.y() - b.y()) <= widestLeg))
-        return samples;
+    // Far off the globe the steps are rounding noise of huge numbers: nothing to fill.
+    for (const double v : {a.x(), a.y(), b.x(), b.y()}) {
+        if (!(std::fabs(v) <= widestLeg))
+            return samples;
+    }
     // Degrees rarely step by more than one unit: leave the common case untouched.
     bool needsFill = false;
     for (size_t i = 1; i < samples.size() && !needsFill; ++i)

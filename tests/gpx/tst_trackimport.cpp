@@ -256,6 +256,13 @@ private slots:
             QVERIFY2(wildPath.curvePoints.size() < 10000, qPrintable(QString::number(wildPath.curvePoints.size())));
         }
 
+        // Found by fuzzing: latitudes of -9.5e15 on a leg of its own once made millions of samples.
+        for (uint32_t aliasing : {0u, 1u, 2u, 3u}) {
+            Path farOff;
+            QVERIFY(TrackImport::read(QStringLiteral(TOURLET_TEST_DATA "/far-off-globe.trk"), farOff, aliasing));
+            QVERIFY2(farOff.curvePoints.size() < 10000, qPrintable(QString::number(farOff.curvePoints.size())));
+        }
+
         Path untouched = ordinaryRoute();
         const size_t before = untouched.keyPoints.size();
         QVERIFY(!TrackImport::read(write(QStringLiteral("broken.gpx"), "<gpx><trk><trkseg><trkpt lat="), untouched, 1));
