@@ -1,5 +1,6 @@
 // Feeds any document to the KML walk, whatever its root element, and then to the
 // dispatching reader.
+#include "FuzzConvert.h"
 #include "FuzzQuiet.h"
 #include "gpx/KmlReader.h"
 #include "gpx/TrackFile.h"
@@ -29,6 +30,6 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size)
     buffer.seek(0);
     TrackFile file;
     file.readXml(&buffer);
-    file.selectItem();
+    convertChosenItem(file, size);
     return 0;
 }

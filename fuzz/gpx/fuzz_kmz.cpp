@@ -1,5 +1,6 @@
 // Loads any bytes as a ".kmz" file: archive opening, extraction into a temporary
 // folder and reading of the documents found there.
+#include "FuzzConvert.h"
 #include "FuzzQuiet.h"
 #include "gpx/TrackFile.h"
 
@@ -31,6 +32,6 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size)
 
     TrackFile file;
     file.load(fileName);
-    file.selectItem();
+    convertChosenItem(file, size);
     return 0;
 }

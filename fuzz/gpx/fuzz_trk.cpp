@@ -1,4 +1,5 @@
 // Feeds any bytes to the line reader of ".trk" files.
+#include "FuzzConvert.h"
 #include "FuzzQuiet.h"
 #include "gpx/TrackFile.h"
 
@@ -20,6 +21,6 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size)
     buffer.open(QIODevice::ReadOnly);
     TrackFile file;
     file.readTrk(&buffer);
-    file.selectItem();
+    convertChosenItem(file, size);
     return 0;
 }

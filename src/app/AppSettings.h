@@ -7,27 +7,27 @@ class QSettings;
 
 // Keys of the per-user store. All of them live at its top level.
 namespace SettingsKey {
-inline constexpr QLatin1String Language{"language"};
-inline constexpr QLatin1String Folder{"folder"};
-inline constexpr QLatin1String ProjectPath{"projectPath"};
-inline constexpr QLatin1String ExportPath{"exportPath"};
-inline constexpr QLatin1String PresetPath{"presetPath"};
-inline constexpr QLatin1String PhotoPath{"photoPath"};
-inline constexpr QLatin1String BrowseContentPath{"browseContentPath"};
-inline constexpr QLatin1String DynamicContentPath{"DynamicContentPath"};
-inline constexpr QLatin1String UserAvatars{"userAvatars"};
-inline constexpr QLatin1String Tracking{"tracking"};
-inline constexpr QLatin1String EnableBetaPatches{"enableBetaPatches"};
-inline constexpr QLatin1String GpxAliasing{"GpxAliasing"};
-inline constexpr QLatin1String MaxAnimationDuration{"MaxAnimationDuration"};
-inline constexpr QLatin1String LastStartedVersion{"LastStartedVersion"};
-inline constexpr QLatin1String Host{"host"};
-inline constexpr QLatin1String RenderLoop{"QSGRenderLoop"};
+inline const QLatin1String Language{"language"};
+inline const QLatin1String Folder{"folder"};
+inline const QLatin1String ProjectPath{"projectPath"};
+inline const QLatin1String ExportPath{"exportPath"};
+inline const QLatin1String PresetPath{"presetPath"};
+inline const QLatin1String PhotoPath{"photoPath"};
+inline const QLatin1String BrowseContentPath{"browseContentPath"};
+inline const QLatin1String DynamicContentPath{"DynamicContentPath"};
+inline const QLatin1String UserAvatars{"userAvatars"};
+inline const QLatin1String Tracking{"tracking"};
+inline const QLatin1String EnableBetaPatches{"enableBetaPatches"};
+inline const QLatin1String GpxAliasing{"GpxAliasing"};
+inline const QLatin1String MaxAnimationDuration{"MaxAnimationDuration"};
+inline const QLatin1String LastStartedVersion{"LastStartedVersion"};
+inline const QLatin1String Host{"host"};
+inline const QLatin1String RenderLoop{"QSGRenderLoop"};
 } // namespace SettingsKey
 
 // Scope names of the per-user store.
-inline constexpr QLatin1String SettingsOrganisation{"Zenko\\Common\\Services"};
-inline constexpr QLatin1String SettingsApplication{"Tourlet"};
+inline const QLatin1String SettingsOrganisation{"Zenko\\Common\\Services"};
+inline const QLatin1String SettingsApplication{"Tourlet"};
 
 // The process-wide per-user store in the native format, made on first use and kept
 // until the process ends.

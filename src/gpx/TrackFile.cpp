@@ -11,6 +11,8 @@
 #include <QFileInfo>
 #include <QTemporaryDir>
 
+#include <algorithm>
+
 bool TrackFile::load(const QString &fileName)
 {
     QFile file(fileName);
@@ -23,6 +25,9 @@ bool TrackFile::load(const QString &fileName)
         logTrace(0, QStringLiteral("File open error: %s"), QStringLiteral("not a regular file"));
         return false;
     }
+
+    // Even the tersest formats spend some 40 bytes on a point.
+    m_items.setExpectedPoints(int(std::min<qint64>(file.size() / 40, 1 << 26)));
 
     const QString suffix = QFileInfo(fileName).suffix();
     if (suffix == QLatin1String("kmz")) {

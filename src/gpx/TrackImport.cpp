@@ -3,22 +3,6 @@
 #include "gpx/TrackFile.h"
 #include "path/Path.h"
 
-namespace {
-
-void fillKeyPoint(KeyPoint &key, const TrackPoint &p)
-{
-    key.setLongitude(p.longitude, true);
-    key.setLatitude(p.latitude, true);
-    if (p.hasAltitude)
-        key.setAltitude(p.altitude, true);
-    if (!p.name.isEmpty()) {
-        key.name = p.name;
-        key.properties.title = p.name;
-    }
-}
-
-} // namespace
-
 bool TrackImport::read(const QString &fileName, Path &outPath, uint32_t aliasing, int32_t fixedDurationSamples,
                        TrackFile *file)
 {
@@ -29,22 +13,23 @@ bool TrackImport::read(const QString &fileName, Path &outPath, uint32_t aliasing
     const int chosen = track.selectItem();
     if (chosen < 0)
         return false;
+    toPath(track, chosen, outPath, aliasing, fixedDurationSamples);
+    return true;
+}
+
+void TrackImport::toPath(const TrackFile &track, int chosen, Path &outPath, uint32_t aliasing,
+                         int32_t fixedDurationSamples)
+{
     const TrackItem &item = track.items()[size_t(chosen)];
 
     Path path;
     path.curveMode = CurveMode::Straight;
     path.pathType = PathType::GPX;
     path.fixedCurve = item.fixedGpxPath;
-    // Points that the conversion thins away need no segments of their own.
     const bool converted = item.fixedGpxPath;
-    path.keyPoints.reserve(size_t(item.points.size()));
-    for (const TrackPoint &p : item.points) {
-        if (converted) {
-            fillKeyPoint(path.keyPoints.emplace_back(), p);
-        } else {
-            KeyPoint key;
-            fillKeyPoint(key, p);
-            path.addKeyPoint(key, false);
+    if (!converted) {
+        for (const TrackPoint &p : item.points) {
+            path.addKeyPoint(keyPointFromTrack(p), false);
         }
     }
 
@@ -55,7 +40,7 @@ bool TrackImport::read(const QString &fileName, Path &outPath, uint32_t aliasing
     bottomRight.setLatitude(item.bounds.bottom, false);
 
     if (converted) {
-        path.convertFromGPX(aliasing, track.isOwnFile(), fixedDurationSamples);
+        path.convertFromGPX(item.points, aliasing, track.isOwnFile(), fixedDurationSamples);
     } else {
         path.pathType = PathType::Ordinary;
         path.update(true);
@@ -64,5 +49,4 @@ bool TrackImport::read(const QString &fileName, Path &outPath, uint32_t aliasing
     // tolerance of 0, which never matches: they leave the route as it is.
     path.setBoundaries(topLeft, bottomRight);
     outPath = std::move(path);
-    return true;
 }

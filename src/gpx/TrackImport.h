@@ -19,4 +19,7 @@ public:
     // `aliasing` is the "GpxAliasing" setting: 0 off, 1 auto, 2 default, 3 max.
     static bool read(const QString &fileName, Path &outPath, uint32_t aliasing,
                      int32_t fixedDurationSamples = fixedDuration, TrackFile *file = nullptr);
+    // The second half of read(): the chosen item of a file already read becomes the path.
+    static void toPath(const TrackFile &file, int chosen, Path &outPath, uint32_t aliasing,
+                       int32_t fixedDurationSamples = fixedDuration);
 };

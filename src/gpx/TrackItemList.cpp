@@ -28,6 +28,9 @@ void TrackItemList::addPoint(double latitude, double longitude, double elevation
     point.altitude = altitude;
     point.hasAltitude = hasAltitude;
     point.name = name;
+    // A long item is given its room at once rather than copied at every doubling.
+    if (item.points.size() == longItem && m_expectedPoints > longItem)
+        item.points.reserve(m_expectedPoints);
     item.points.append(std::move(point));
     item.bounds.include(longitude, latitude);
 }

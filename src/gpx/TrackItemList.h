@@ -32,6 +32,11 @@ public:
     // position to the one before it is dropped unless it has a positive altitude or a name.
     void addPoint(double latitude, double longitude, double elevation, const QString &name);
 
+    // The most points that the data can hold, as far as its size tells.
+    void setExpectedPoints(int count) { m_expectedPoints = count; }
+
 private:
+    static constexpr int longItem = 4096;
     std::vector<TrackItem> m_items;
+    int m_expectedPoints = 0;
 };

@@ -1,21 +1,12 @@
 #pragma once
 
+#include "path/TrackPoint.h"
+
 #include <QRectF>
 #include <QString>
 #include <QVector>
 
 #include <cstdint>
-
-// One position of a track file as read: geography, elevation and the point's name.
-struct TrackPoint
-{
-    double longitude = 0.0;
-    double latitude = 0.0;
-    double altitude = 0.0;    // 0 unless the file gave an elevation
-    bool hasAltitude = false; // the file gave an elevation (which may itself be 0)
-    QString name;             // also the point's title; empty for plain track points
-};
-Q_DECLARE_TYPEINFO(TrackPoint, Q_MOVABLE_TYPE);
 
 // The extent of an item's points. A side of exactly 0 counts as unset and is taken
 // by the next point, so an all-zero value means nothing has been seen.

@@ -23,11 +23,16 @@ QPointF outerPoint(const QPointF &from, const QPointF &to)
     return QPointF(f(from.x() + f(dx / d) * share), f(from.y() + f(dy / d) * share));
 }
 
+// No leg between valid coordinates spans more units than this; a damaged file's
+// point far beyond them must not make millions of samples.
+constexpr double widestLeg = 720.0;
+
 int sampleCount(const QPointF &a, const QPointF &b)
 {
     const double dLon = std::trunc(std::fabs(a.x() - b.x()));
     const double dLat = std::trunc(std::fabs(a.y() - b.y()));
-    return static_cast<int>(std::max(dLon, dLat)) + baseSamples;
+    const double span = std::max(dLon, dLat);
+    return static_cast<int>(span < widestLeg ? span : widestLeg) + baseSamples;
 }
 
 QPointF unwrapLon(QPointF p);
@@ -180,6 +185,11 @@ Leg fillGaps(const Leg &samples, const QPointF &a, const QPointF &b)
 {
     if (samples.empty())
         return {};
+    // Far off the globe the steps are rounding noise of huge numbers: nothing to fill.
+    for (const double v : {a.x(), a.y(), b.x(), b.y()}) {
+        if (!(std::fabs(v) <= widestLeg))
+            return samples;
+    }
     // Degrees rarely step by more than one unit: leave the common case untouched.
     bool needsFill = false;
     for (size_t i = 1; i < samples.size() && !needsFill; ++i)

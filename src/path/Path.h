@@ -4,6 +4,7 @@
 #include "path/KeyPoint.h"
 #include "path/MediaPoint.h"
 #include "path/PathSegment.h"
+#include "path/TrackPoint.h"
 
 #include <QString>
 
@@ -85,6 +86,8 @@ public:
     // path: the thinned track becomes the curve, and only the first and last key
     // point (and, for files of our own, the titled ones) stay.
     bool convertFromGPX(uint32_t aliasing, bool ownFile, int32_t fixedDuration);
+    // The same from the points of a file, without making a key point of each.
+    bool convertFromGPX(TrackPoints points, uint32_t aliasing, bool ownFile, int32_t fixedDuration);
 
 private:
     struct MediaAnchor
@@ -100,7 +103,8 @@ private:
         double y = 0.0;
     };
 
-    double gpxThreshold(uint32_t aliasing, int32_t fixedDuration);
+    template<typename Points>
+    bool convertTrack(Points &points, uint32_t aliasing, bool ownFile, int32_t fixedDuration);
     void setFixedKeyPoints(std::vector<FixedKeyPoint> &fixed, bool ownFile);
 
     void updateCurvePoints();

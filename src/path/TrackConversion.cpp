@@ -12,46 +12,6 @@ constexpr int32_t samplesPerLegBeforeThinning = 200;
 constexpr int32_t msPerSample = 3;
 }
 
-double Path::gpxThreshold(uint32_t aliasing, int32_t fixedDuration)
-{
-    if (aliasing == 0)
-        return std::numeric_limits<double>::max();
-    const bool big = aliasing == 1 && keyPoints.size() > 10000;
-    logTrace(0, QStringLiteral("m_GPXFixedDuration %d"), fixedDuration);
-
-    // Repeated positions go; a titled repeat replaces the point before it.
-    double complete = 0.0;
-    double minDistance = std::numeric_limits<double>::max();
-    int count = 0;
-    size_t kept = keyPoints.empty() ? 0 : 1;
-    for (size_t i = 1; i < keyPoints.size(); ++i) {
-        KeyPoint &previous = keyPoints[kept - 1];
-        KeyPoint &point = keyPoints[i];
-        if (point.x == previous.x && point.y == previous.y) {
-            if (!point.title().isEmpty())
-                previous = std::move(point);
-            continue;
-        }
-        const double d = geoDistance(point.y, point.x, previous.y, previous.x);
-        complete += d;
-        ++count;
-        minDistance = std::min(minDistance, d);
-        if (kept != i)
-            keyPoints[kept] = std::move(point);
-        ++kept;
-    }
-    keyPoints.resize(kept);
-
-    const double byCount = complete / count;
-    const double byTarget = complete / fixedDuration;
-    logTrace(0, QStringLiteral("fMinDistance: %f"), minDistance);
-    logTrace(0, QStringLiteral("fDistanceComplete: %f"), complete);
-    logTrace(0, QStringLiteral("fDistanceAverage: %f"), byCount);
-    if (aliasing == 2 || big)
-        return std::min(byTarget, byCount);
-    return std::min(byTarget, minDistance);
-}
-
 void Path::setFixedKeyPoints(std::vector<FixedKeyPoint> &fixed, bool ownFile)
 {
     keyPoints.clear();
@@ -91,24 +51,61 @@ void Path::setFixedKeyPoints(std::vector<FixedKeyPoint> &fixed, bool ownFile)
     }
 }
 
-bool Path::convertFromGPX(uint32_t aliasing, bool ownFile, int32_t fixedDuration)
+namespace {
+
+KeyPoint keyPointOf(const KeyPoint &k)
 {
-    const double threshold = gpxThreshold(aliasing, fixedDuration);
-    std::vector<FixedKeyPoint> fixed;
-    if (aliasing == 0 || keyPoints.size() < 2) {
-        curvePoints.clear();
-        curvePoints.reserve(keyPoints.size());
-        for (size_t i = 0; i < keyPoints.size(); ++i) {
-            const KeyPoint &k = keyPoints[i];
-            curvePoints.emplace_back(k.x, k.y, k.z);
-            if (i == 0 || i + 1 == keyPoints.size() || !k.title().isEmpty())
-                fixed.push_back({k, i, true});
-        }
+    return k;
+}
+
+KeyPoint keyPointOf(const TrackPoint &p)
+{
+    return keyPointFromTrack(p);
+}
+
+// The fixed points with their places; made before the path's key points go.
+template<typename Points>
+std::vector<FixedKeyPoint> thinOrCopy(const Points &points, double threshold, bool thin, std::vector<CurvePoint> &curve)
+{
+    std::vector<FixedPlace> places;
+    if (thin) {
+        places = thinTrack(points, threshold, curve);
     } else {
-        fixed = thinTrack(keyPoints, threshold, curvePoints);
+        curve.clear();
+        curve.reserve(size_t(points.size()));
+        for (size_t i = 0; i < size_t(points.size()); ++i) {
+            const auto &p = points[i];
+            curve.emplace_back(trackpoint::x(p), trackpoint::y(p), trackpoint::z(p));
+            if (i == 0 || i + 1 == size_t(points.size()) || trackpoint::titled(p))
+                places.push_back({i, i, true});
+        }
     }
+    std::vector<FixedKeyPoint> fixed;
+    fixed.reserve(places.size());
+    for (const FixedPlace &place : places)
+        fixed.push_back({keyPointOf(points[place.source]), place.index, place.placed});
+    return fixed;
+}
+
+} // namespace
+
+template<typename Points>
+bool Path::convertTrack(Points &points, uint32_t aliasing, bool ownFile, int32_t fixedDuration)
+{
+    const double threshold = gpxThresholdOf(points, aliasing, fixedDuration);
+    std::vector<FixedKeyPoint> fixed = thinOrCopy(points, threshold, aliasing != 0 && points.size() >= 2, curvePoints);
     setFixedKeyPoints(fixed, ownFile);
     if (!pathSegments.empty())
         pathSegments.front().curvePoints = curvePoints;
     return true;
+}
+
+bool Path::convertFromGPX(uint32_t aliasing, bool ownFile, int32_t fixedDuration)
+{
+    return convertTrack(keyPoints, aliasing, ownFile, fixedDuration);
+}
+
+bool Path::convertFromGPX(TrackPoints points, uint32_t aliasing, bool ownFile, int32_t fixedDuration)
+{
+    return convertTrack(points, aliasing, ownFile, fixedDuration);
 }

@@ -245,6 +245,24 @@ private slots:
         QVERIFY(TrackImport::read(file, all, 0));
         QCOMPARE(all.curvePoints.size(), size_t(5000));
 
+        // Coordinates far outside the globe make short work, not millions of samples.
+        const QString wild = write(QStringLiteral("wild.gpx"),
+                                   "<gpx><trk><trkseg><trkpt lat=\"10\" lon=\"0.5\"/><trkpt lat=\"11\" lon=\"1e7\"/>"
+                                   "<trkpt lat=\"1e200\" lon=\"-1e300\"/><trkpt lat=\"12\" lon=\"3\"/></trkseg></trk></gpx>");
+        for (uint32_t aliasing : {0u, 1u, 2u, 3u}) {
+            Path wildPath;
+            QVERIFY(TrackImport::read(wild, wildPath, aliasing));
+            QVERIFY(!wildPath.curvePoints.empty());
+            QVERIFY2(wildPath.curvePoints.size() < 10000, qPrintable(QString::number(wildPath.curvePoints.size())));
+        }
+
+        // Found by fuzzing: latitudes of -9.5e15 on a leg of its own once made millions of samples.
+        for (uint32_t aliasing : {0u, 1u, 2u, 3u}) {
+            Path farOff;
+            QVERIFY(TrackImport::read(QStringLiteral(TOURLET_TEST_DATA "/far-off-globe.trk"), farOff, aliasing));
+            QVERIFY2(farOff.curvePoints.size() < 10000, qPrintable(QString::number(farOff.curvePoints.size())));
+        }
+
         Path untouched = ordinaryRoute();
         const size_t before = untouched.keyPoints.size();
         QVERIFY(!TrackImport::read(write(QStringLiteral("broken.gpx"), "<gpx><trk><trkseg><trkpt lat="), untouched, 1));

@@ -376,6 +376,14 @@ private slots:
         QCOMPARE(CurveGenerator::roundHalfAway(-2.5), -2.0);
         QCOMPARE(CurveGenerator::roundHalfAway(-2.6), -3.0);
         QVERIFY(fillGaps({}, {0, 0}, {1, 1}).empty());
+
+        // Off the globe, as in damaged files, steps are rounding noise of huge
+        // numbers and nothing is filled in, however wide they are.
+        const QPointF farA(51, -9.5e15), farB(0, -9.5e15);
+        QCOMPARE(fillGaps({farA, {25, -9.5e15 + 1e6}, farB}, farA, farB).size(), size_t(3));
+        QCOMPARE(fillGaps({{0, 0}, {0, 1e12}}, {0, 0}, {0, 1e12}).size(), size_t(2));
+        // A leg between valid coordinates keeps its filling.
+        QCOMPARE(fillGaps({{-170, 80}, {170, -80}}, {-170, 80}, {170, -80}).size(), size_t(2 + 339));
     }
 };
 

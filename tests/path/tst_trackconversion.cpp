@@ -170,7 +170,7 @@ private slots:
         for (double threshold : {0.0, 1.0, 37.5, 180.0, 1000.0, 50000.0}) {
             const std::vector<QPointF> expected = thinPlainly(wander, threshold);
             std::vector<CurvePoint> curve;
-            const std::vector<FixedKeyPoint> fixed = thinTrack(path.keyPoints, threshold, curve);
+            const std::vector<FixedPlace> fixed = thinTrack(path.keyPoints, threshold, curve);
             QCOMPARE(curve.size(), expected.size());
             for (size_t i = 0; i < expected.size(); ++i) {
                 QCOMPARE(curve[i].x, expected[i].x());
@@ -179,6 +179,63 @@ private slots:
             QCOMPARE(fixed.size(), size_t(2));
             QCOMPARE(fixed.front().index, size_t(0));
             QCOMPARE(fixed.back().index, curve.size() - 1);
+        }
+    }
+
+    void filePointsConvertLikeKeyPoints()
+    {
+        // The light points of a file and the key points of a path are one track:
+        // repeats, titles, altitudes and a wrap across the antimeridian included.
+        QRandomGenerator random(5);
+        std::vector<QPointF> wander{{179.95, 60.0}};
+        for (int i = 0; i < 600; ++i) {
+            QPointF next = wander.back() + QPointF(random.bounded(0.002), random.bounded(0.002) - 0.001);
+            if (next.x() > 180)
+                next.setX(next.x() - 360);
+            wander.push_back(i % 50 == 7 ? wander.back() : next);
+        }
+        QStringList titles;
+        for (size_t i = 0; i < wander.size(); ++i)
+            titles << (i % 120 == 8 ? QStringLiteral("stop %1").arg(i) : QString());
+
+        for (uint32_t aliasing : {0u, 1u, 2u, 3u}) {
+            for (bool own : {false, true}) {
+                Path fromKeys = trackPath(wander, titles);
+                fromKeys.convertFromGPX(aliasing, own, 500);
+
+                TrackPoints points;
+                for (size_t i = 0; i < wander.size(); ++i) {
+                    TrackPoint p;
+                    p.longitude = wander[i].x();
+                    p.latitude = wander[i].y();
+                    p.altitude = double(i);
+                    p.hasAltitude = true;
+                    p.name = titles[int(i)];
+                    points.push_back(p);
+                }
+                Path fromFile;
+                fromFile.curveMode = CurveMode::Straight;
+                fromFile.pathType = PathType::GPX;
+                fromFile.convertFromGPX(points, aliasing, own, 500);
+
+                QCOMPARE(fromFile.curvePoints.size(), fromKeys.curvePoints.size());
+                for (size_t i = 0; i < fromKeys.curvePoints.size(); ++i) {
+                    QCOMPARE(fromFile.curvePoints[i].x, fromKeys.curvePoints[i].x);
+                    QCOMPARE(fromFile.curvePoints[i].y, fromKeys.curvePoints[i].y);
+                    QCOMPARE(fromFile.curvePoints[i].z, fromKeys.curvePoints[i].z);
+                    QCOMPARE(fromFile.curvePoints[i].correspondingKeyPoint != 0,
+                             fromKeys.curvePoints[i].correspondingKeyPoint != 0);
+                }
+                QCOMPARE(fromFile.keyPoints.size(), fromKeys.keyPoints.size());
+                for (size_t i = 0; i < fromKeys.keyPoints.size(); ++i) {
+                    QCOMPARE(fromFile.keyPoints[i].title(), fromKeys.keyPoints[i].title());
+                    QCOMPARE(fromFile.keyPoints[i].x, fromKeys.keyPoints[i].x);
+                    QCOMPARE(fromFile.keyPoints[i].properties.durationToNextKP,
+                             fromKeys.keyPoints[i].properties.durationToNextKP);
+                }
+                QCOMPARE(fromFile.pathSegments.size(), fromFile.keyPoints.size());
+                QVERIFY(fromFile.keyPoints.size() >= (own ? size_t(7) : size_t(2)));
+            }
         }
     }
 
