@@ -34,6 +34,7 @@ bool QProjectController::createProjectFile(QString fileName)
         logTrace(3, QStringLiteral("QProjectController::createProjectFile[%s] - writer/reader object always created"), fileName);
         return false;
     }
+    m_writeFailed = false;
     // The old file goes before the new one is written: callers that must not
     // lose it keep their own copy first.
     if (QFile::exists(fileName))
@@ -46,6 +47,7 @@ bool QProjectController::createProjectFile(QString fileName)
     if (!QFile::exists(fileName)) {
         logTrace(3, QStringLiteral("QProjectController::createProjectFile: can't create file %s"), fileName);
         m_fileName.clear();
+        m_writeFailed = true;
         return true;
     }
     startWriter(fileName);
@@ -59,6 +61,7 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
         logTrace(3, QStringLiteral("QProjectController::openProjectFile[%s] - writer/reader object always created"), fileName);
         return false;
     }
+    m_writeFailed = false;
     if (!forLoad) {
         m_fileName = fileName;
         startWriter(fileName);
@@ -90,6 +93,7 @@ bool QProjectController::writeProperty(QString section, QString key, QString val
 {
     if (!m_writer) {
         logTrace(3, QStringLiteral("QProjectController::writeProperty[%s]: writer object doesn't exist"), m_fileName);
+        m_writeFailed = true;
         return false;
     }
     m_writer->setValue(address(section, key), value);
@@ -115,8 +119,13 @@ bool QProjectController::closeProjectFile()
 {
     // The writer is synced before it goes, so the next open in the same turn
     // sees the whole file.
-    if (m_writer)
+    if (m_writer) {
         m_writer->sync();
+        if (m_writer->status() != QSettings::NoError) {
+            logTrace(3, QStringLiteral("QProjectController::closeProjectFile[%s] - the file could not be written"), m_fileName);
+            m_writeFailed = true;
+        }
+    }
     m_writer.reset();
     m_reader.reset();
     return true;

@@ -24,9 +24,15 @@ public:
     bool isWriting() const { return m_writer != nullptr; }
     bool isReading() const { return m_reader != nullptr; }
 
+    // Whether anything of the last write went wrong: no file could be made, a
+    // property met no writer, or the store could not put the file on disk.
+    // Cleared by the next create or open.
+    bool lastWriteFailed() const { return m_writeFailed; }
+
 private:
     void startWriter(const QString &fileName);
 
     std::unique_ptr<QSettings> m_writer;
     std::unique_ptr<QSettings> m_reader;
+    bool m_writeFailed = false;
 };

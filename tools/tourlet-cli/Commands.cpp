@@ -4,5 +4,7 @@ std::vector<CliCommand> allCommands()
 {
     std::vector<CliCommand> commands;
     commands.push_back(curveCommand());
+    commands.push_back(projectCommand());
+    commands.push_back(convertCommand());
     return commands;
 }

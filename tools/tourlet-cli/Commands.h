@@ -8,3 +8,5 @@
 std::vector<CliCommand> allCommands();
 
 CliCommand curveCommand();
+CliCommand projectCommand();
+CliCommand convertCommand();
