@@ -30,34 +30,40 @@ int sampleCount(const QPointF &a, const QPointF &b)
     return static_cast<int>(std::max(dLon, dLat)) + baseSamples;
 }
 
+QPointF unwrapLon(QPointF p);
+
 void finishLeg(Leg &leg, const QPointF &a, const QPointF &b, bool wrapped)
 {
     leg = fillGaps(leg, a, b);
     if (wrapped) {
-        for (QPointF &p : leg) {
-            if (p.x() > 180.0)
-                p.setX(p.x() - 180.0 - 180.0);
-            else if (p.x() < -180.0)
-                p.setX(p.x() + 360.0);
-        }
+        for (QPointF &p : leg)
+            p = unwrapLon(p);
     }
     if (leg.empty())
         leg.push_back(a);
+}
+
+QPointF unwrapLon(QPointF p)
+{
+    if (p.x() > 180.0)
+        p.setX(p.x() - 180.0 - 180.0);
+    else if (p.x() < -180.0)
+        p.setX(p.x() + 360.0);
+    return p;
 }
 
 // One leg of the straight or smooth generator; prev/next are the neighbouring
 // key points, or null where an outer point stands in.
 Leg makeLeg(const QPointF &a, const QPointF &bRaw, const QPointF *prev, const QPointF *next)
 {
+    if (!prev && !next)
+        return StraightLeg(a, bRaw).samples();
     const WrappedLon wb = wrapAgainst(a.x(), bRaw.x());
     const QPointF b(wb.lon, bRaw.y());
     bool wrapped = wb.wrapped;
 
-    QPointF p0 = outerPoint(a, b);
+    QPointF p0 = prev ? QPointF(wrapAgainst(a.x(), prev->x()).lon, prev->y()) : outerPoint(a, b);
     QPointF p3 = outerPoint(b, a);
-    if (prev) {
-        p0 = QPointF(wrapAgainst(a.x(), prev->x()).lon, prev->y());
-    }
     if (next) {
         const WrappedLon wn = wrapAgainst(b.x(), next->x());
         p3 = QPointF(wn.lon, next->y());
@@ -66,7 +72,7 @@ Leg makeLeg(const QPointF &a, const QPointF &bRaw, const QPointF *prev, const QP
     }
     Leg leg;
     const int steps = sampleCount(a, b);
-    leg.reserve(steps + 2);
+    leg.reserve(size_t(steps) + 2);
     appendSpline(leg, p0, a, b, p3, steps);
     finishLeg(leg, a, b, wrapped);
     return leg;
@@ -108,29 +114,66 @@ double roundHalfAway(double v)
     return t + std::trunc(v - t + 0.5);
 }
 
-void appendSpline(Leg &out, const QPointF &p0, const QPointF &p1, const QPointF &p2, const QPointF &p3, int steps)
+Spline::Spline(const QPointF &p0, const QPointF &p1, const QPointF &p2, const QPointF &p3, int steps)
+    : m_p0(p0), m_p1(p1), m_p2(p2), m_p3(p3)
 {
     auto knot = [](const QPointF &u, const QPointF &v) {
         const double dx = u.x() - v.x(), dy = u.y() - v.y();
         return std::pow(std::sqrt(dx * dx + dy * dy), knotExponent);
     };
-    const double t1 = knot(p0, p1);
-    const double t2 = t1 + knot(p1, p2);
-    const double t3 = t2 + knot(p2, p3);
-    if (!(t1 < t2) || steps <= 0)
+    m_t1 = knot(p0, p1);
+    m_t2 = m_t1 + knot(p1, p2);
+    m_t3 = m_t2 + knot(p2, p3);
+    if (!(m_t1 < m_t2) || steps <= 0)
         return;
+    m_steps = steps;
+    m_step = (m_t2 - m_t1) / steps;
+}
+
+QPointF Spline::at(int j) const
+{
     // Counting the steps instead of adding them up keeps the sample count at
     // exactly `steps`, whatever the rounding of the sum.
-    const double step = (t2 - t1) / steps;
-    for (int j = 0; j < steps; ++j) {
-        const double t = t1 + j * step;
-        const QPointF a1 = ((t1 - t) / t1) * p0 + (t / t1) * p1;
-        const QPointF a2 = ((t2 - t) / (t2 - t1)) * p1 + ((t - t1) / (t2 - t1)) * p2;
-        const QPointF a3 = ((t3 - t) / (t3 - t2)) * p2 + ((t - t2) / (t3 - t2)) * p3;
-        const QPointF b1 = ((t2 - t) / t2) * a1 + (t / t2) * a2;
-        const QPointF b2 = ((t3 - t) / (t3 - t1)) * a2 + ((t - t1) / (t3 - t1)) * a3;
-        out.push_back(((t2 - t) / (t2 - t1)) * b1 + ((t - t1) / (t2 - t1)) * b2);
-    }
+    const double t = m_t1 + j * m_step;
+    const double t1 = m_t1, t2 = m_t2, t3 = m_t3;
+    const QPointF a1 = ((t1 - t) / t1) * m_p0 + (t / t1) * m_p1;
+    const QPointF a2 = ((t2 - t) / (t2 - t1)) * m_p1 + ((t - t1) / (t2 - t1)) * m_p2;
+    const QPointF a3 = ((t3 - t) / (t3 - t2)) * m_p2 + ((t - t2) / (t3 - t2)) * m_p3;
+    const QPointF b1 = ((t2 - t) / t2) * a1 + (t / t2) * a2;
+    const QPointF b2 = ((t3 - t) / (t3 - t1)) * a2 + ((t - t1) / (t3 - t1)) * a3;
+    return ((t2 - t) / (t2 - t1)) * b1 + ((t - t1) / (t2 - t1)) * b2;
+}
+
+void appendSpline(Leg &out, const QPointF &p0, const QPointF &p1, const QPointF &p2, const QPointF &p3, int steps)
+{
+    const Spline spline(p0, p1, p2, p3, steps);
+    for (int j = 0; j < spline.size(); ++j)
+        out.push_back(spline.at(j));
+}
+
+StraightLeg::StraightLeg(const QPointF &a, const QPointF &bRaw)
+    : m_a(a)
+    , m_b(wrapAgainst(a.x(), bRaw.x()).lon, bRaw.y())
+    , m_wrapped(wrapAgainst(a.x(), bRaw.x()).wrapped)
+    , m_stepsAreSmall(std::fabs(a.x() - m_b.x()) < 1.0 && std::fabs(a.y() - m_b.y()) < 1.0)
+    , m_spline(outerPoint(m_a, m_b), m_a, m_b, outerPoint(m_b, m_a), sampleCount(m_a, m_b))
+{
+}
+
+Leg StraightLeg::samples() const
+{
+    Leg leg;
+    leg.reserve(size_t(m_spline.size()) + 2);
+    for (int j = 0; j < m_spline.size(); ++j)
+        leg.push_back(m_spline.at(j));
+    finishLeg(leg, m_a, m_b, m_wrapped);
+    return leg;
+}
+
+QPointF StraightLeg::sample(int j) const
+{
+    const QPointF p = m_spline.at(j);
+    return m_wrapped ? unwrapLon(p) : p;
 }
 
 Leg fillGaps(const Leg &samples, const QPointF &a, const QPointF &b)

@@ -11,6 +11,7 @@
 #include <vector>
 
 class ProjectController;
+struct FixedKeyPoint;
 
 namespace PathType {
 constexpr int32_t Ordinary = 1;
@@ -80,6 +81,11 @@ public:
     void initCorrespondingObjectIds();
     bool LoadCurvePoints(ProjectController &store, const QString &section);
 
+    // Turns a path whose key points are the points of a track into a fixed track
+    // path: the thinned track becomes the curve, and only the first and last key
+    // point (and, for files of our own, the titled ones) stay.
+    bool convertFromGPX(uint32_t aliasing, bool ownFile, int32_t fixedDuration);
+
 private:
     struct MediaAnchor
     {
@@ -93,6 +99,9 @@ private:
         double x = 0.0;
         double y = 0.0;
     };
+
+    double gpxThreshold(uint32_t aliasing, int32_t fixedDuration);
+    void setFixedKeyPoints(std::vector<FixedKeyPoint> &fixed, bool ownFile);
 
     void updateCurvePoints();
     std::vector<MediaAnchor> collectMediaAnchors(bool keepPosition) const;
