@@ -562,6 +562,14 @@ private slots:
         QCOMPARE(readBytes(backup), good);
         QFile::remove(backup);
 
+        // A place where no file can be made: the container goes on as documented,
+        // the save as a whole reports the failure.
+        const QString nowhere = path(QStringLiteral("no such folder/x.zkgeo"));
+        QVERIFY(doc.SaveProject(nowhere));
+        QVERIFY(doc.projectController().lastWriteFailed());
+        QVERIFY(!saveDocumentFile(doc, nowhere));
+        QVERIFY(!QFile::exists(nowhere));
+
         // No copy can be made: nothing is written.
         const QString intoFolder = path(QStringLiteral("folder.zkgeo"));
         writeText(intoFolder, "old");
