@@ -197,11 +197,17 @@ bool saveAltitudePreset(ProjectController &store, const QString &fileName, const
                                                                     : store.createProjectFile(fileName);
     if (!opened)
         return false;
+    const bool written = writeAltitudePreset(store, prefix, preset);
+    store.closeProjectFile();
+    return written;
+}
+
+bool writeAltitudePreset(ProjectController &store, const QString &prefix, const AltitudePreset &preset)
+{
     bool written = true;
     for (const PresetKey &k : presetKeys) {
         written = store.writeProperty(sectionName(prefix, k.section), QLatin1String(k.key),
                                       std::visit(Formatter{preset}, k.member)) && written;
     }
-    store.closeProjectFile();
     return written;
 }

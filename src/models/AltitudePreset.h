@@ -76,3 +76,6 @@ bool loadAltitudePreset(ProjectController &store, const QString &fileName, const
 // Writes the preset under `prefix`. A project file (".zkgeo" in the name) is
 // opened for adding, so that it keeps its content; any other file is created anew.
 bool saveAltitudePreset(ProjectController &store, const QString &fileName, const QString &prefix, const AltitudePreset &preset);
+
+// The keys of the preset under `prefix`, into a container already open for writing.
+bool writeAltitudePreset(ProjectController &store, const QString &prefix, const AltitudePreset &preset);

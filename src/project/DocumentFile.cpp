@@ -67,10 +67,6 @@ DocumentOpenResult openDocumentFile(PainterPathRenderer_Controller &document, co
 bool saveDocumentFile(PainterPathRenderer_Controller &document, const QString &fileName)
 {
     return saveWithBackup(fileName, [&] {
-        QProjectController &store = document.projectController();
-        if (!document.SaveProject(fileName) || store.lastWriteFailed())
-            return false;
-        return document.saveAltitudePreset(fileName, QStringLiteral("altprs."), document.altitudePreset())
-            && !store.lastWriteFailed();
+        return document.SaveProjectWithTheme(fileName) && !document.projectController().lastWriteFailed();
     });
 }

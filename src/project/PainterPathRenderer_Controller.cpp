@@ -7,6 +7,8 @@
 #include "project/ProjectSaver.h"
 #include "project/ValueParsers.h"
 
+#include <QElapsedTimer>
+
 PainterPathRenderer_Controller::PainterPathRenderer_Controller() = default;
 
 void PainterPathRenderer_Controller::reset()
@@ -40,10 +42,31 @@ void PainterPathRenderer_Controller::newProject()
 
 bool PainterPathRenderer_Controller::SaveProject(const QString &fileName)
 {
+    return save(fileName, false);
+}
+
+bool PainterPathRenderer_Controller::SaveProjectWithTheme(const QString &fileName)
+{
+    return save(fileName, true);
+}
+
+bool PainterPathRenderer_Controller::save(const QString &fileName, bool withTheme)
+{
+    QElapsedTimer timer;
+    timer.start();
     const bool created = m_projectController.createProjectFile(fileName);
-    if (created)
+    if (created) {
         ProjectSaver(*this, m_projectController).write();
+        if (withTheme) {
+            AltitudePreset stamped = m_altitudePreset;
+            stamped.version = m_fields.versionText;
+            writeAltitudePreset(m_projectController, altitudePresetPrefix(), stamped);
+        }
+    }
+    const qint64 written = timer.elapsed();
     m_projectController.closeProjectFile();
+    logTrace(0, QStringLiteral("PainterPathRenderer_Controller::SaveProject[%s] - %d ms to write, %d ms to close"), fileName,
+             written, timer.elapsed() - written);
     return created;
 }
 
@@ -56,8 +79,11 @@ ProjectLoadResult PainterPathRenderer_Controller::LoadProject(const QString &fil
         return result;
     }
     m_pathManager.addPath(QStringLiteral("fileName"));
+    QElapsedTimer timer;
+    timer.start();
     try {
         ProjectLoader(*this, m_projectController).read();
+        logTrace(0, QStringLiteral("PainterPathRenderer_Controller::LoadProject[%s] - read in %d ms"), fileName, timer.elapsed());
         result.status = ProjectLoadResult::Status::Loaded;
     } catch (const DamagedNumberError &error) {
         logTrace(3, QStringLiteral("PainterPathRenderer_Controller::LoadProject[%s] - damaged number: %s"), fileName,

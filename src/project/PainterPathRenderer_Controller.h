@@ -32,6 +32,10 @@ public:
     // Creates the file anew and writes the document; false when the file could not
     // be created. The container is closed in every case.
     bool SaveProject(const QString &fileName);
+    // SaveProject, then the active theme with the prefix "altprs." into the same
+    // file, as saveAltitudePreset adds it, but in one writing of the file: the bytes
+    // are those of the two steps, without reading a large file back in between.
+    bool SaveProjectWithTheme(const QString &fileName);
     // Reads the file into the document, which the caller has reset. A damaged number
     // ends the load and leaves the document as a new project.
     ProjectLoadResult LoadProject(const QString &fileName);
@@ -69,6 +73,8 @@ public:
     void setKeyPointsFixed(bool on) { m_keyPointsFixed = on; }
 
 private:
+    bool save(const QString &fileName, bool withTheme);
+
     ProjectFields m_fields;
     AnimationTiming m_timing;
     PathManager m_pathManager;

@@ -414,6 +414,25 @@ private slots:
         QCOMPARE(q.mediaPoints.size(), size_t(2));
     }
 
+    void themeInTheSameWritingGivesTheSameBytes()
+    {
+        QImage image(8, 8, QImage::Format_RGB32);
+        image.fill(Qt::blue);
+        const QString picture = path(QStringLiteral("theme.png"));
+        QVERIFY(image.save(picture));
+        PainterPathRenderer_Controller doc;
+        fillDocument(doc, picture);
+        doc.altitudePreset().background = QStringLiteral("C:\\boards\\one, two.png");
+
+        const QString twoSteps = path(QStringLiteral("two steps.zkgeo"));
+        QVERIFY(doc.SaveProject(twoSteps));
+        QVERIFY(doc.saveAltitudePreset(twoSteps, altitudePresetPrefix(), doc.altitudePreset()));
+        const QString oneStep = path(QStringLiteral("one step.zkgeo"));
+        QVERIFY(doc.SaveProjectWithTheme(oneStep));
+        QVERIFY(readBytes(oneStep).contains("[altprs.graph]"));
+        QCOMPARE(readBytes(oneStep), readBytes(twoSteps));
+    }
+
     void keyOrderDoesNotMatter()
     {
         QImage image(8, 8, QImage::Format_RGB32);
