@@ -70,7 +70,7 @@ void saveProject(benchmark::State &state)
     state.counters["curvePoints"] = double(doc.pathManager().activeChecked().curvePoints.size());
     state.counters["MB"] = double(QFileInfo(file).size()) / 1e6;
 }
-BENCHMARK(saveProject)->Arg(56)->Arg(1)->Unit(benchmark::kMillisecond)->Iterations(3);
+BENCHMARK(saveProject)->Arg(56)->Arg(1)->Unit(benchmark::kMillisecond)->Iterations(2);
 
 // The project part alone, without the altitude theme and the backup copy.
 void saveProjectFileOnly(benchmark::State &state)
@@ -105,7 +105,7 @@ void loadProject(benchmark::State &state)
     state.counters["curvePoints"] = double(doc.pathManager().activeChecked().curvePoints.size());
     state.counters["photos"] = double(doc.photoPool().photos.size());
 }
-BENCHMARK(loadProject)->Arg(56)->Arg(1)->Unit(benchmark::kMillisecond)->Iterations(3);
+BENCHMARK(loadProject)->Arg(56)->Arg(1)->Unit(benchmark::kMillisecond)->Iterations(2);
 
 } // namespace
 

@@ -1,6 +1,5 @@
 #include "project/DocumentFile.h"
 
-#include "app/Trace.h"
 #include "project/BackupSave.h"
 #include "project/PainterPathRenderer_Controller.h"
 #include "project/TrackImport.h"

@@ -4,7 +4,6 @@
 
 class PainterPathRenderer_Controller;
 class ProjectController;
-class Path;
 
 // Reads a document from an open container, in the order of the format: later
 // steps rely on what earlier ones have left. Missing keys keep the document's
