@@ -7,9 +7,14 @@ namespace cli {
 
 void printJson(const QJsonObject &object)
 {
+    printJsonText(QJsonDocument(object).toJson(QJsonDocument::Compact));
+}
+
+void printJsonText(const QByteArray &json)
+{
     QFile out;
     out.open(stdout, QIODevice::WriteOnly);
-    out.write(QJsonDocument(object).toJson(QJsonDocument::Compact));
+    out.write(json);
     out.write("\n");
 }
 

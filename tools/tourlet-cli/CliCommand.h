@@ -19,6 +19,7 @@ struct CliCommand
 namespace cli {
 void printJson(const QJsonObject &object);       // one compact JSON object and a newline
 void printJsonLine(const QJsonObject &object);   // the same, meant for streams of objects
+void printJsonText(const QByteArray &json);      // JSON already written, and a newline
 int fail(const QString &message, int code = 1);  // one line on stderr, returns code
 
 // Takes "--name value" out of args; returns false when the option is absent.

@@ -6,5 +6,8 @@ std::vector<CliCommand> allCommands()
     commands.push_back(curveCommand());
     commands.push_back(projectCommand());
     commands.push_back(convertCommand());
+    commands.push_back(trackCommand());
+    commands.push_back(contentCommand());
+    commands.push_back(encodeCommand());
     return commands;
 }

@@ -10,3 +10,6 @@ std::vector<CliCommand> allCommands();
 CliCommand curveCommand();
 CliCommand projectCommand();
 CliCommand convertCommand();
+CliCommand trackCommand();
+CliCommand contentCommand();
+CliCommand encodeCommand();

@@ -1,0 +1,36 @@
+// Loads any bytes as a ".kmz" file: archive opening, extraction into a temporary
+// folder and reading of the documents found there.
+#include "FuzzQuiet.h"
+#include "gpx/TrackFile.h"
+
+#include <QFile>
+#include <QTemporaryDir>
+
+#include <cstddef>
+#include <cstdint>
+
+namespace {
+QTemporaryDir *inputFolder = nullptr;
+}
+
+extern "C" int LLVMFuzzerInitialize(int *, char ***)
+{
+    silenceQtMessages();
+    inputFolder = new QTemporaryDir;
+    return 0;
+}
+
+extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size)
+{
+    const QString fileName = inputFolder->filePath(QStringLiteral("input.kmz"));
+    QFile input(fileName);
+    if (!input.open(QIODevice::WriteOnly | QIODevice::Truncate))
+        return 0;
+    input.write(reinterpret_cast<const char *>(data), qint64(size));
+    input.close();
+
+    TrackFile file;
+    file.load(fileName);
+    file.selectItem();
+    return 0;
+}

@@ -1,0 +1,279 @@
+#include "ContentFiles.h"
+
+#include "content/ContentIni.h"
+#include "content/IniAccess.h"
+
+#include <QSettings>
+#include <QTemporaryDir>
+#include <QTest>
+
+#include <sys/stat.h>
+
+class TestContentIni : public QObject
+{
+    Q_OBJECT
+
+private:
+    QTemporaryDir m_dir;
+    QString path(const QString &name) const { return m_dir.filePath(name); }
+    static QString value(const QString &file, const QString &section, const QString &key)
+    {
+        return readIniValue(file, section, key, true, QStringLiteral("<absent>"));
+    }
+
+private slots:
+    void sectionAndKeyLines()
+    {
+        const QString file = path(QStringLiteral("lines.ini"));
+        QVERIFY(writeFile(file,
+                          "top=level\n"
+                          "[Big Name]\n"
+                          "a=1\n"
+                          "[ Big  Name ]\n"
+                          "b=2\n"
+                          "[ Spaced Name ]\n"
+                          "key = a = b\n"
+                          "a b = c\n"
+                          "= c\n"
+                          "empty =\n"
+                          "Case=MiXed Value\n"
+                          "dup=first\n"
+                          "dup=second\n"
+                          "  folder\\sub =  x  \n"
+                          "link=a=b\n"
+                          "; note = not a key\n"
+                          "[Tab\tbed]\n"
+                          "t=after tab header\n"
+                          "[a]]\n"
+                          "z=bracket\n"));
+        QCOMPARE(value(file, QString(), QStringLiteral("top")), QStringLiteral("level"));
+        QCOMPARE(value(file, QStringLiteral("Big Name"), QStringLiteral("a")), QStringLiteral("1"));
+        // Two blanks make no section: the key stays in the one before.
+        QCOMPARE(value(file, QStringLiteral("Big Name"), QStringLiteral("b")), QStringLiteral("2"));
+        QCOMPARE(value(file, QStringLiteral("Big  Name"), QStringLiteral("b")), QStringLiteral("<absent>"));
+        const QString spaced = QStringLiteral("Spaced Name");
+        QCOMPARE(value(file, spaced, QStringLiteral("key")), QStringLiteral("a = b"));
+        QCOMPARE(value(file, spaced, QStringLiteral("a b")), QStringLiteral("<absent>"));
+        QCOMPARE(value(file, spaced, QStringLiteral("a")), QStringLiteral("<absent>"));
+        QCOMPARE(value(file, spaced, QString()), QStringLiteral("<absent>"));
+        QCOMPARE(value(file, spaced, QStringLiteral("empty")), QStringLiteral("<absent>"));
+        // Key and section case don't matter, value case stays.
+        QCOMPARE(value(file, QStringLiteral("SPACED name"), QStringLiteral("cASE")), QStringLiteral("MiXed Value"));
+        QCOMPARE(value(file, spaced, QStringLiteral("dup")), QStringLiteral("second"));
+        QCOMPARE(value(file, spaced, QStringLiteral("folder/sub")), QStringLiteral("x"));
+        // The key takes the last "=" of a line without blanks around the first one.
+        QCOMPARE(value(file, spaced, QStringLiteral("link=a")), QStringLiteral("b"));
+        QCOMPARE(value(file, spaced, QStringLiteral("note")), QStringLiteral("<absent>"));
+        // A tab inside the brackets is no section either.
+        QCOMPARE(value(file, spaced, QStringLiteral("t")), QStringLiteral("after tab header"));
+        QCOMPARE(value(file, QStringLiteral("a]"), QStringLiteral("z")), QStringLiteral("bracket"));
+        QCOMPARE(value(path(QStringLiteral("missing.ini")), spaced, QStringLiteral("key")), QStringLiteral("<absent>"));
+    }
+
+    void valuesStayAsWritten()
+    {
+        const QString file = path(QStringLiteral("values.ini"));
+        QVERIFY(writeFile(file, "[main]\n"
+                                "list=a, b,c\n"
+                                "mixed=one;two, \"three\" 'four' C:\\dir\\file.png\n"
+                                "quoted=\"quoted\"\n"
+                                "hash=#FF0000 ; trailing\n"));
+        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("list")), QStringLiteral("a, b,c"));
+        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("mixed")),
+                 QStringLiteral("one;two, \"three\" 'four' C:\\dir\\file.png"));
+        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("quoted")), QStringLiteral("\"quoted\""));
+        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("hash")), QStringLiteral("#FF0000 ; trailing"));
+        // The platform format reads the same lines its own way.
+        QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("quoted"), false), QStringLiteral("quoted"));
+        QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("hash"), false), QStringLiteral("#FF0000"));
+        QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("nokey"), false, QStringLiteral("d")),
+                 QStringLiteral("d"));
+        QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("list"), QStringLiteral(","), false),
+                 QStringList({QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("c")}));
+        QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("list"), QStringLiteral(","), true),
+                 QStringList({QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("c")}));
+        // QSettings shares one parse per path between formats; the content reads must not see it.
+        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("quoted")), QStringLiteral("\"quoted\""));
+        QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("mixed"), QStringLiteral(";"), true),
+                 QStringList({QStringLiteral("one"), QStringLiteral("two, \"three\" 'four' C:\\dir\\file.png")}));
+    }
+
+    void encodingsAndLineEnds()
+    {
+        const QString text = QStringLiteral("[Grüße]\r\nname=Fähre ✈\rother=東京\n\n\n");
+        QByteArray utf16le, utf16be;
+        for (const QChar c : text) {
+            utf16le += char(c.unicode() & 0xFF);
+            utf16le += char(c.unicode() >> 8);
+            utf16be += char(c.unicode() >> 8);
+            utf16be += char(c.unicode() & 0xFF);
+        }
+        const QList<QPair<QString, QByteArray>> files = {
+            {QStringLiteral("plain-utf8.ini"), text.toUtf8()},
+            {QStringLiteral("bom-utf8.ini"), QByteArray("\xEF\xBB\xBF") + text.toUtf8()},
+            {QStringLiteral("bom-utf16le.ini"), QByteArray("\xFF\xFE") + utf16le},
+            {QStringLiteral("bom-utf16be.ini"), QByteArray("\xFE\xFF") + utf16be},
+        };
+        for (const auto &f : files) {
+            const QString file = path(f.first);
+            QVERIFY(writeFile(file, f.second));
+            QCOMPARE(value(file, QStringLiteral("grüße"), QStringLiteral("NAME")), QStringLiteral("Fähre ✈"));
+            QCOMPARE(value(file, QStringLiteral("Grüße"), QStringLiteral("other")), QStringLiteral("東京"));
+        }
+        // Bytes that are no UTF-8 are taken as Latin-1.
+        const QString latin = path(QStringLiteral("latin1.ini"));
+        QVERIFY(writeFile(latin, "[main]\nname=F\xE4hre\n"));
+        QCOMPARE(value(latin, QStringLiteral("main"), QStringLiteral("name")), QStringLiteral("Fähre"));
+    }
+
+    void damagedFilesGiveDefaults()
+    {
+        QByteArray garbage;
+        for (int i = 0; i < 5000; ++i)
+            garbage += char((i * 7919) % 256);
+        const QList<QByteArray> bodies = {garbage, QByteArray(), QByteArray("["), QByteArray("=\n=\n[]\n[ ]"),
+                                          QByteArray(200000, 'x') + "=" + QByteArray(200000, ' ') + "y",
+                                          QByteArray("\xFF\xFE\x00"), QByteArray("\xEF\xBB\xBF")};
+        for (int i = 0; i < bodies.size(); ++i) {
+            const QString file = path(QStringLiteral("damaged%1.ini").arg(i));
+            QVERIFY(writeFile(file, bodies.at(i)));
+            QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("type")), QStringLiteral("<absent>"));
+            QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("type"), false, QStringLiteral("d")),
+                     QStringLiteral("d"));
+        }
+        // Things that are no small regular file are not read at all.
+        const QString folder = path(QStringLiteral("folder.ini"));
+        QVERIFY(QDir().mkpath(folder));
+        const QString fifo = path(QStringLiteral("pipe.ini"));
+        QCOMPARE(::mkfifo(QFile::encodeName(fifo).constData(), 0600), 0);
+        const QString huge = path(QStringLiteral("huge.ini"));
+        QVERIFY(writeFile(huge, "[main]\ntype=png\n" + QByteArray(17 * 1024 * 1024, '\n')));
+        for (const QString &file : {folder, fifo, huge}) {
+            for (bool contentIni : {true, false}) {
+                QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("type"), contentIni, QStringLiteral("d")),
+                         QStringLiteral("d"));
+                IniReadCache cache;
+                QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("type"), contentIni, QStringLiteral("d")),
+                         QStringLiteral("d"));
+            }
+        }
+
+        QSettings::SettingsMap map;
+        ContentIni::parse(QByteArray(200000, 'x') + "=" + QByteArray(200000, ' ') + "y", map);
+        QCOMPARE(map.size(), 1);
+        QCOMPARE(map.first().toString(), QStringLiteral("y"));
+    }
+
+    void registeredFormatIsReadOnly()
+    {
+        QCOMPARE(ContentIni::format(), ContentIni::format());
+        const QString file = path(QStringLiteral("splash.ini"));
+        const QByteArray original = "[Text]\nTitle=Hello, world; \"quoted\"\n";
+        QVERIFY(writeFile(file, original));
+        {
+            QSettings settings(file, ContentIni::format());
+            // Keys are stored lower-cased; QSettings itself compares them as given.
+            QCOMPARE(settings.value(QStringLiteral("text/title")).toString(), QStringLiteral("Hello, world; \"quoted\""));
+            QCOMPARE(settings.childGroups(), QStringList{QStringLiteral("text")});
+            settings.setValue(QStringLiteral("Text/Title"), QStringLiteral("changed"));
+            settings.sync();
+            QCOMPARE(settings.status(), QSettings::AccessError);
+        }
+        QFile f(file);
+        QVERIFY(f.open(QIODevice::ReadOnly));
+        QCOMPARE(f.readAll(), original);
+    }
+
+    void listsArePrependedAndRemoved()
+    {
+        const QString file = path(QStringLiteral("lists/tourletContent.ini"));
+        QDir().mkpath(QFileInfo(file).path());
+        QVERIFY(prependIniListValue(file, QStringLiteral("/data/userAvatars/u3d_car"), QStringLiteral("avatars"),
+                                    QStringLiteral("paths")));
+        QVERIFY(prependIniListValue(file, QStringLiteral("/data/userAvatars/u3d_Zürich(1)"), QStringLiteral("avatars"),
+                                    QStringLiteral("paths")));
+        QVERIFY(prependIniListValue(file, QStringLiteral("/data/userAvatars/u3d_car"), QStringLiteral("avatars"),
+                                    QStringLiteral("paths")));
+        QVERIFY(prependIniListValue(file, QStringLiteral("/maps/extra"), QStringLiteral("maps"), QStringLiteral("paths")));
+        const QStringList expected = {QStringLiteral("/data/userAvatars/u3d_car"),
+                                      QStringLiteral("/data/userAvatars/u3d_Zürich(1)"),
+                                      QStringLiteral("/data/userAvatars/u3d_car")};
+        // Written by the platform format, read back by the content format.
+        QCOMPARE(readIniList(file, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), true), expected);
+        QCOMPARE(readIniList(file, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), false), expected);
+
+        QVERIFY(removeIniListValue(file, QStringLiteral("u3d_car"), QStringLiteral("avatars"), QStringLiteral("paths")));
+        QCOMPARE(readIniList(file, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), true),
+                 QStringList{QStringLiteral("/data/userAvatars/u3d_Zürich(1)")});
+        QVERIFY(removeIniListValue(file, QStringLiteral("u3d_Zürich(1)"), QStringLiteral("avatars"), QStringLiteral("paths")));
+        QVERIFY(readIniList(file, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), true).isEmpty());
+        QCOMPARE(readIniList(file, QStringLiteral("maps"), QStringLiteral("paths"), QStringLiteral(","), true),
+                 QStringList{QStringLiteral("/maps/extra")});
+        // An empty list is written as no key, so the next prepend starts clean.
+        QVERIFY(prependIniListValue(file, QStringLiteral("/again"), QStringLiteral("avatars"), QStringLiteral("paths")));
+        QCOMPARE(readIniList(file, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), true),
+                 QStringList{QStringLiteral("/again")});
+        QVERIFY(!removeIniListValue(path(QStringLiteral("lists/none.ini")), QStringLiteral("x"), QStringLiteral("a"),
+                                    QStringLiteral("b")));
+        // Below a plain file no folder can be made.
+        QVERIFY(!prependIniListValue(file + QStringLiteral("/x.ini"), QStringLiteral("v"), QStringLiteral("a"),
+                                     QStringLiteral("b")));
+    }
+
+    void listValuesFollowTheList()
+    {
+        const QString file = path(QStringLiteral("listvalues.ini"));
+        QVERIFY(writeFile(file, "[main]\norder=b, a ,missing\nA=first\nb=second\n[names]\na=named a\n"));
+        QCOMPARE(readIniListValues(file, QStringLiteral("main"), QStringLiteral("order")),
+                 QStringList({QStringLiteral("second"), QStringLiteral("first"), QString()}));
+        QCOMPARE(readIniListValues(file, QStringLiteral("main"), QStringLiteral("order"), QStringLiteral("names")),
+                 QStringList({QString(), QStringLiteral("named a"), QString()}));
+    }
+
+    void folderHelpers()
+    {
+        const QString root = path(QStringLiteral("folders/"));
+        for (const char *name : {"informations/b.ini", "informations/A.ini", "informations/c.INI", "informations/x.txt",
+                                 "informations/z.v2.ini", "sub1/deep/f", "sub2/f"})
+            QVERIFY(writeFile(root + QString::fromLatin1(name), "x"));
+        QCOMPARE(listInformationStems(root),
+                 QStringList({QStringLiteral("A"), QStringLiteral("b"), QStringLiteral("z.v2")}));
+        QCOMPARE(listFileStems(root + QStringLiteral("informations"), QStringLiteral("*.txt")), QStringList{QStringLiteral("x")});
+        QVERIFY(listFileStems(root + QStringLiteral("nothing"), QStringLiteral("*.ini")).isEmpty());
+        QStringList flat = listSubfolders(root, false);
+        flat.sort();
+        QCOMPARE(flat, QStringList({root + QStringLiteral("informations"), root + QStringLiteral("sub1"),
+                                    root + QStringLiteral("sub2")}));
+        QCOMPARE(listSubfolders(root, true).size(), 4);
+        QVERIFY(listSubfolders(root + QStringLiteral("nothing"), true).isEmpty());
+        QVERIFY(samePath(QStringLiteral("/A/b/"), QStringLiteral("/a/B/")));
+        QVERIFY(!samePath(QStringLiteral("/a/b"), QStringLiteral("/a/b/")));
+        QVERIFY(fileExists(root + QStringLiteral("sub1")));
+        QVERIFY(!fileExists(QString()));
+    }
+
+    void cachedReadsMatchFreshReads()
+    {
+        const QString file = path(QStringLiteral("cached.ini"));
+        QVERIFY(writeFile(file, "[main]\nv=1\nlist=a,b\n"));
+        const QString fresh = readIniValue(file, QStringLiteral("main"), QStringLiteral("v"), true);
+        {
+            IniReadCache cache;
+            QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("v"), true), fresh);
+            QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("V"), true), fresh);
+            QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("v"), false), fresh);
+            QCOMPARE(readIniValue(path(QStringLiteral("absent.ini")), QStringLiteral("main"), QStringLiteral("v"), false,
+                                  QStringLiteral("d")),
+                     QStringLiteral("d"));
+            // A write through the layer is seen by the next read.
+            QVERIFY(prependIniListValue(file, QStringLiteral("z"), QStringLiteral("main"), QStringLiteral("list")));
+            QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("list"), QStringLiteral(","), true),
+                     QStringList({QStringLiteral("z"), QStringLiteral("a"), QStringLiteral("b")}));
+            QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("list"), QStringLiteral(","), false),
+                     QStringList({QStringLiteral("z"), QStringLiteral("a"), QStringLiteral("b")}));
+        }
+    }
+};
+
+QTEST_GUILESS_MAIN(TestContentIni)
+#include "tst_contentini.moc"

@@ -1,0 +1,237 @@
+#include "ContentFiles.h"
+
+#include "content/ContentCatalogue.h"
+#include "content/IniAccess.h"
+#include "content/UserAvatars.h"
+
+#include <QDirIterator>
+#include <QSettings>
+#include <QTemporaryDir>
+#include <QTest>
+
+#include <zip.h>
+
+#include <utility>
+#include <vector>
+
+namespace {
+
+using Entries = std::vector<std::pair<QByteArray, QByteArray>>; // name, content; a name ending in "/" is a folder
+
+bool writeZip(const QString &path, const Entries &entries)
+{
+    int error = 0;
+    zip_t *archive = zip_open(QFile::encodeName(path).constData(), ZIP_CREATE | ZIP_TRUNCATE, &error);
+    if (!archive)
+        return false;
+    for (const auto &entry : entries) {
+        if (entry.first.endsWith('/')) {
+            if (zip_dir_add(archive, entry.first.constData(), ZIP_FL_ENC_UTF_8) < 0)
+                return false;
+            continue;
+        }
+        zip_source_t *source = zip_source_buffer(archive, entry.second.constData(), zip_uint64_t(entry.second.size()), 0);
+        if (!source || zip_file_add(archive, entry.first.constData(), source, ZIP_FL_ENC_UTF_8) < 0) {
+            zip_source_free(source);
+            zip_discard(archive);
+            return false;
+        }
+    }
+    return zip_close(archive) == 0;
+}
+
+QStringList entriesBelow(const QString &folder)
+{
+    QStringList out;
+    QDirIterator it(folder, QDir::AllEntries | QDir::NoDotAndDotDot | QDir::Hidden, QDirIterator::Subdirectories);
+    while (it.hasNext())
+        out << it.next().mid(folder.size());
+    out.sort();
+    return out;
+}
+
+} // namespace
+
+class TestUserAvatars : public QObject
+{
+    Q_OBJECT
+
+private:
+    QTemporaryDir m_dir;
+    QString path(const QString &name) const { return m_dir.filePath(name); }
+
+private slots:
+    void zipSuffix()
+    {
+        QVERIFY(isZipAvatar(QStringLiteral("/a/car.zip")));
+        QVERIFY(!isZipAvatar(QStringLiteral("/a/car.ZIP")));
+        QVERIFY(!isZipAvatar(QStringLiteral("/a/car.tar.zip")));
+        QVERIFY(!isZipAvatar(QStringLiteral("/a/car.png")));
+        QVERIFY(!isZipAvatar(QStringLiteral("/a/zip")));
+    }
+
+    void importTwiceAndScan()
+    {
+        const QString data = path(QStringLiteral("data"));
+        QVERIFY(QDir().mkpath(data));
+        const QString zip = path(QStringLiteral("Car.zip"));
+        QVERIFY(writeZip(zip, {{"car_2.png", "two"}, {"car_1.png", "one"}, {"readme.txt", "hello"}, {"extra/", ""},
+                               {"extra/car_9.png", "nested"}}));
+        clearImportError();
+        QString picture;
+        QVERIFY(importZipAvatar(data, zip, picture));
+        QCOMPARE(importErrorNumber(), 0u);
+        QCOMPARE(importErrorText(), QStringLiteral("noError"));
+        const QString first = data + QStringLiteral("/userAvatars/u3d_Car");
+        QCOMPARE(picture, first + QStringLiteral("/ZK3D/u3d_Car/u3d_Car_1.png"));
+        QCOMPARE(entriesBelow(first + QStringLiteral("/ZK3D/u3d_Car")),
+                 QStringList({QStringLiteral("/extra"), QStringLiteral("/extra/car_9.png"), QStringLiteral("/readme.txt"),
+                              QStringLiteral("/u3d_Car_1.png"), QStringLiteral("/u3d_Car_2.png")}));
+        QFile one(picture);
+        QVERIFY(one.open(QIODevice::ReadOnly));
+        QCOMPARE(one.readAll(), QByteArray("one"));
+
+        const QString ini = first + QStringLiteral("/informations/u3d_Car.ini");
+        QSettings written(ini, QSettings::IniFormat);
+        QCOMPARE(written.value(QStringLiteral("main/type")).toString(), QStringLiteral("png"));
+        QCOMPARE(written.value(QStringLiteral("main/displayFormat")).toString(), QStringLiteral("perspective"));
+        QCOMPARE(written.value(QStringLiteral("main/defaultWidth")).toString(), QStringLiteral("20"));
+        QCOMPARE(written.value(QStringLiteral("main/gName")).toString(), QStringLiteral("User3d"));
+        QCOMPARE(written.value(QStringLiteral("main/isUserContent")).toString(), QStringLiteral("true"));
+        QCOMPARE(written.value(QStringLiteral("main/allowRotation")).toString(), QStringLiteral("true"));
+        QCOMPARE(written.value(QStringLiteral("main/animated")).toString(), QStringLiteral("false"));
+
+        QString again;
+        QVERIFY(importZipAvatar(data, zip, again));
+        const QString second = data + QStringLiteral("/userAvatars/u3d_Car(1)");
+        QCOMPARE(again, second + QStringLiteral("/ZK3D/u3d_Car(1)/u3d_Car(1)_1.png"));
+        QVERIFY(QFileInfo::exists(first + QStringLiteral("/ZK3D/u3d_Car/u3d_Car_2.png")));
+        const QString contentIni = data + QStringLiteral("/tourletContent.ini");
+        QCOMPARE(readIniList(contentIni, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), true),
+                 QStringList({second, first}));
+
+        // The next start finds both, as perspective user avatars whose frames exist.
+        QTemporaryDir imageRoot;
+        ContentCatalogue catalogue;
+        QVERIFY(catalogue.load(imageRoot.path() + QLatin1Char('/'), data));
+        const std::vector<AvatarItem> avatars = catalogue.avatars();
+        QCOMPARE(int(avatars.size()), 2);
+        for (const AvatarItem &a : avatars) {
+            QVERIFY(a.perspective == 1 && a.isUserContent && a.allowRotation && a.animated == 0);
+            QVERIFY2(QFileInfo::exists(a.thumbFile), qPrintable(a.thumbFile));
+            QVERIFY(QFileInfo::exists(a.sourceFile + QStringLiteral("_2.png")));
+        }
+        QCOMPARE(avatars.at(0).name + avatars.at(1).name, QStringLiteral("u3d_Car(1)u3d_Car"));
+
+        // Deleting by stem, as the avatar list does, leaves the other entry.
+        QVERIFY(removeIniListValue(contentIni, QStringLiteral("u3d_Car(1)"), QStringLiteral("avatars"),
+                                   QStringLiteral("paths")));
+        QCOMPARE(readIniList(contentIni, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), true),
+                 QStringList{first});
+    }
+
+    void failedImports()
+    {
+        const QString data = path(QStringLiteral("fails"));
+        QVERIFY(QDir().mkpath(data));
+        QString picture = QStringLiteral("unchanged");
+
+        const QString text = path(QStringLiteral("notes.zip"));
+        QVERIFY(writeFile(text, "just some text, no archive\n"));
+        QVERIFY(!importZipAvatar(data, text, picture));
+        QCOMPARE(importErrorNumber(), 1392u);
+        QVERIFY(importErrorText() != QStringLiteral("noError"));
+
+        QVERIFY(!importZipAvatar(data, path(QStringLiteral("missing.zip")), picture));
+        QCOMPARE(importErrorNumber(), 3u);
+
+        const QString noPng = path(QStringLiteral("nopng.zip"));
+        QVERIFY(writeZip(noPng, {{"a.jpg", "x"}, {"b.PNG.txt", "y"}}));
+        QVERIFY(!importZipAvatar(data, noPng, picture));
+        QCOMPARE(importErrorNumber(), 2u);
+        QCOMPARE(picture, QStringLiteral("unchanged"));
+        // The folder of a failed import stays, but the avatar is not entered.
+        QVERIFY(QFileInfo::exists(data + QStringLiteral("/userAvatars/u3d_nopng/ZK3D/u3d_nopng/a.jpg")));
+        QVERIFY(readIniList(data + QStringLiteral("/tourletContent.ini"), QStringLiteral("avatars"),
+                            QStringLiteral("paths"), QStringLiteral(","), true)
+                    .isEmpty());
+
+        const QString good = path(QStringLiteral("good.zip"));
+        QVERIFY(writeZip(good, {{"g_1.png", "x"}}));
+        // Names that look like format markers stay as they are.
+        const QString percent = path(QStringLiteral("p%1.zip"));
+        QVERIFY(QFile::copy(good, percent));
+        QVERIFY(importZipAvatar(data, percent, picture));
+        QVERIFY(importZipAvatar(data, percent, picture));
+        QCOMPARE(picture, data + QStringLiteral("/userAvatars/u3d_p%1(1)/ZK3D/u3d_p%1(1)/u3d_p%1(1)_1.png"));
+        QVERIFY(QFileInfo::exists(picture));
+
+        QVERIFY(!importZipAvatar(QString(), good, picture));
+        QCOMPARE(importErrorNumber(), 3u);
+        QVERIFY(!importZipAvatar(path(QStringLiteral("no/such/data")), good, picture));
+        QCOMPARE(importErrorNumber(), 3u);
+        clearImportError();
+        QCOMPARE(importErrorText(), QStringLiteral("noError"));
+    }
+
+    void hostileArchivesWriteNothing()
+    {
+        const QString data = path(QStringLiteral("hostile"));
+        QVERIFY(QDir().mkpath(data));
+        const QList<Entries> hostile = {
+            {{"ok_1.png", "x"}, {"../escape.png", "evil"}},
+            {{"ok_1.png", "x"}, {"sub/../../../escape.png", "evil"}},
+            {{"/tmp/escape.png", "evil"}},
+            {{"ok_1.png", "x"}, {"..\\escape.png", "evil"}},
+            {{"C:/escape.png", "evil"}},
+        };
+        const QStringList before = entriesBelow(m_dir.path());
+        for (int i = 0; i < hostile.size(); ++i) {
+            const QString zip = path(QStringLiteral("hostile%1.zip").arg(i));
+            QVERIFY(writeZip(zip, hostile.at(i)));
+            QString picture;
+            QVERIFY(!importZipAvatar(data, zip, picture));
+            QCOMPARE(importErrorNumber(), 14u);
+        }
+        QStringList after = entriesBelow(m_dir.path());
+        for (int i = 0; i < hostile.size(); ++i)
+            after.removeAll(QStringLiteral("/hostile%1.zip").arg(i));
+        QCOMPARE(after, before);
+        QVERIFY(!QFileInfo::exists(QStringLiteral("/tmp/escape.png")) || QFileInfo(QStringLiteral("/tmp/escape.png")).size() != 4);
+
+        // Entries above the size limit are refused before anything is written.
+        const QString big = path(QStringLiteral("big.zip"));
+        QVERIFY(writeZip(big, {{"a_1.png", QByteArray(4096, 'a')}}));
+        const QString target = path(QStringLiteral("bigtarget"));
+        QVERIFY(!unpackZipArchive(big, target, 1024));
+        QCOMPARE(importErrorNumber(), 14u);
+        QVERIFY(!QFileInfo::exists(target));
+        QVERIFY(unpackZipArchive(big, target, 4096));
+        QCOMPARE(QFileInfo(target + QStringLiteral("/a_1.png")).size(), 4096);
+    }
+
+    void migrationMovesOldLayout()
+    {
+        const QString folder = path(QStringLiteral("migrate/userAvatars"));
+        QVERIFY(writeFile(folder + QStringLiteral("/u3d_old/u3d_old/u3d_old_1.png"), "1"));
+        QVERIFY(writeFile(folder + QStringLiteral("/u3d_old/informations/u3d_old.ini"), "[main]\n"));
+        QVERIFY(writeFile(folder + QStringLiteral("/u3d_new/ZK3D/u3d_new/u3d_new_1.png"), "1"));
+        migrateUserAvatars(folder);
+        const QStringList once = entriesBelow(folder);
+        QCOMPARE(once, QStringList({QStringLiteral("/u3d_new"), QStringLiteral("/u3d_new/ZK3D"),
+                                    QStringLiteral("/u3d_new/ZK3D/u3d_new"), QStringLiteral("/u3d_new/ZK3D/u3d_new/u3d_new_1.png"),
+                                    QStringLiteral("/u3d_old"), QStringLiteral("/u3d_old/ZK3D"),
+                                    QStringLiteral("/u3d_old/ZK3D/u3d_old"), QStringLiteral("/u3d_old/ZK3D/u3d_old/u3d_old_1.png"),
+                                    QStringLiteral("/u3d_old/informations"),
+                                    QStringLiteral("/u3d_old/informations/u3d_old.ini")}));
+        QSettings settings(path(QStringLiteral("migrate/settings.ini")), QSettings::IniFormat);
+        migrateUserAvatars(folder, settings);
+        QCOMPARE(entriesBelow(folder), once);
+        QCOMPARE(settings.value(QStringLiteral("userAvatars")).toString(), folder);
+        migrateUserAvatars(path(QStringLiteral("migrate/none")));
+        QVERIFY(!QFileInfo::exists(path(QStringLiteral("migrate/none"))));
+    }
+};
+
+QTEST_GUILESS_MAIN(TestUserAvatars)
+#include "tst_useravatars.moc"

@@ -1,0 +1,179 @@
+#include "gpx/KmzArchive.h"
+#include "gpx/TrackFile.h"
+
+#include <QDir>
+#include <QFile>
+#include <QTemporaryDir>
+#include <QTest>
+
+#include <zip.h>
+
+namespace {
+
+struct Entry
+{
+    QByteArray name;
+    QByteArray data;
+    bool folder = false;
+};
+
+const QByteArray documentA = "<kml><Document><Placemark><LineString><coordinates>7,46,1 7.5,46.5,2</coordinates>"
+                             "</LineString></Placemark></Document></kml>";
+const QByteArray documentB = "<kml><Placemark><Point><coordinates>1,2</coordinates></Point></Placemark></kml>";
+
+} // namespace
+
+class TestKmz : public QObject
+{
+    Q_OBJECT
+
+private:
+    QTemporaryDir m_dir;
+
+    // Builds an archive with stored (uncompressed) entries so that sizes can be patched.
+    QString makeZip(const char *fileName, const QVector<Entry> &entries)
+    {
+        const QString file = m_dir.filePath(QString::fromLatin1(fileName));
+        int error = 0;
+        zip_t *archive = zip_open(QFile::encodeName(file).constData(), ZIP_CREATE | ZIP_TRUNCATE, &error);
+        if (!archive)
+            qFatal("cannot create zip");
+        for (const Entry &entry : entries) {
+            zip_int64_t index;
+            if (entry.folder) {
+                index = zip_dir_add(archive, entry.name.constData(), ZIP_FL_ENC_UTF_8);
+            } else {
+                zip_source_t *source = zip_source_buffer(archive, entry.data.constData(), zip_uint64_t(entry.data.size()), 0);
+                index = zip_file_add(archive, entry.name.constData(), source, ZIP_FL_ENC_UTF_8 | ZIP_FL_OVERWRITE);
+                if (index >= 0)
+                    zip_set_file_compression(archive, zip_uint64_t(index), ZIP_CM_STORE, 0);
+            }
+            if (index < 0)
+                qFatal("cannot add zip entry %s", entry.name.constData());
+        }
+        if (zip_close(archive) != 0)
+            qFatal("cannot write zip");
+        return file;
+    }
+    static QByteArray readAll(const QString &file)
+    {
+        QFile f(file);
+        return f.open(QIODevice::ReadOnly) ? f.readAll() : QByteArray();
+    }
+    static void writeAll(const QString &file, const QByteArray &bytes)
+    {
+        QFile f(file);
+        QVERIFY(f.open(QIODevice::WriteOnly));
+        f.write(bytes);
+    }
+
+private slots:
+    void readsTheDocumentOfAnArchive()
+    {
+        const QString kmz = makeZip("good.kmz", {{"files/", {}, true},
+                                                 {"files/icon.png", "\x89PNG...."},
+                                                 {"images/deep/photo.jpg", "jpeg"}, // no folder entry of its own
+                                                 {"doc.kml", documentA}});
+        TrackFile file;
+        QVERIFY(file.load(kmz));
+        QCOMPARE(int(file.items().size()), 1);
+        QCOMPARE(file.items()[0].points.size(), 2);
+        QCOMPARE(file.items()[0].points[1].altitude, 2.0);
+
+        QTemporaryDir out;
+        QVERIFY(KmzArchive::extract(kmz, out.path()));
+        QCOMPARE(readAll(out.filePath("doc.kml")), documentA);
+        QCOMPARE(readAll(out.filePath("images/deep/photo.jpg")), QByteArray("jpeg"));
+        QVERIFY(QFileInfo(out.filePath("files")).isDir());
+
+        // A dot in the document's name is part of its base name.
+        QVERIFY(file.load(makeZip("dotted.kmz", {{"my.route.kml", documentA}})));
+    }
+
+    void archivesWithoutAUsableDocument()
+    {
+        TrackFile file;
+        QVERIFY(!file.load(makeZip("none.kmz", {{"readme.txt", "hello"}, {"files/", {}, true}})));
+        QVERIFY(!file.load(makeZip("nested.kmz", {{"files/doc.kml", documentA}}))); // only the top folder counts
+        QVERIFY(!file.load(makeZip("emptydoc.kmz", {{"doc.kml", QByteArray()}})));  // size 0 makes a folder
+
+        // The suffix test is exact: ".KMZ" reads as XML and fails at the first element.
+        const QString upper = m_dir.filePath("upper.KMZ");
+        QVERIFY(QFile::copy(makeZip("upper-src.kmz", {{"doc.kml", documentA}}), upper));
+        QVERIFY(!file.load(upper));
+
+        // Not an archive, a cut archive, and an archive with a damaged entry.
+        QVERIFY(!file.load(m_dir.filePath("missing.kmz")));
+        const QString plain = m_dir.filePath("plain.kmz");
+        writeAll(plain, documentA);
+        QVERIFY(!file.load(plain));
+        const QByteArray whole = readAll(makeZip("whole.kmz", {{"doc.kml", documentA}}));
+        const QString cut = m_dir.filePath("cut.kmz");
+        writeAll(cut, whole.left(whole.size() / 2));
+        QVERIFY(!file.load(cut));
+        QByteArray damaged = whole;
+        damaged[damaged.indexOf("<kml>") + 2] = 'X'; // the stored checksum no longer matches
+        const QString bad = m_dir.filePath("crc.kmz");
+        writeAll(bad, damaged);
+        QVERIFY(!file.load(bad));
+        QVERIFY(QDir(m_dir.path()).mkdir("folder.kmz"));
+        QVERIFY(!file.load(m_dir.filePath("folder.kmz")));
+    }
+
+    void severalDocumentsReadTheFirstAndFail()
+    {
+        TrackFile file;
+        QVERIFY(!file.load(makeZip("two.kmz", {{"b.kml", documentB}, {"a.kml", documentA}})));
+        QCOMPARE(int(file.items().size()), 1);
+        QCOMPARE(file.items()[0].points.size(), 2); // a.kml sorts first and was read
+    }
+
+    void hostileEntriesEndTheExtraction()
+    {
+        const QStringList unsafe = {"../evil.kml", "/tmp/abs.kml", "a/../../b.kml", "..", "..\\win.kml", "x/..\\..\\y"};
+        for (const QString &name : unsafe)
+            QVERIFY2(!KmzArchive::isSafeEntryName(name), qPrintable(name));
+        const QStringList safe = {"doc.kml", "files/a..b.png", "...", "a/./b", "", "files/"};
+        for (const QString &name : safe)
+            QVERIFY2(KmzArchive::isSafeEntryName(name), qPrintable(name));
+
+        QTemporaryDir root;
+        const QString inside = root.filePath("inside");
+        QVERIFY(QDir().mkpath(inside));
+        const QString climbing =
+            makeZip("climb.kmz", {{"doc.kml", documentA}, {"../evil.kml", documentB}, {"later.kml", documentB}});
+        QVERIFY(!KmzArchive::extract(climbing, inside));
+        QVERIFY(QFile::exists(inside + "/doc.kml"));
+        QVERIFY(!QFile::exists(root.filePath("evil.kml")));
+        QVERIFY(!QFile::exists(inside + "/later.kml")); // the first failed entry ends it
+        TrackFile file;
+        QVERIFY(!file.load(climbing));
+
+        const QString absolute = makeZip("abs.kmz", {{"/abs-kmz-test.kml", documentA}});
+        QVERIFY(!KmzArchive::extract(absolute, inside));
+        QVERIFY(!QFile::exists("/abs-kmz-test.kml"));
+
+        // An entry that claims to be larger than allowed fails before anything is read.
+        QByteArray bytes = readAll(makeZip("big.kmz", {{"doc.kml", documentA}}));
+        const int central = bytes.indexOf(QByteArray("PK\x01\x02", 4));
+        QVERIFY(central > 0);
+        const quint32 claimed = quint32(KmzArchive::maxEntrySize + 1);
+        for (int i = 0; i < 4; ++i)
+            bytes[central + 24 + i] = char((claimed >> (8 * i)) & 0xFF);
+        const QString big = m_dir.filePath("patched.kmz");
+        writeAll(big, bytes);
+        QVERIFY(!KmzArchive::extract(big, root.filePath("big")));
+        QVERIFY(!QFile::exists(root.filePath("big/doc.kml")));
+        QVERIFY(!file.load(big));
+
+        // Exactly at the limit is allowed to start, but the entry can't deliver it.
+        const quint32 limit = quint32(KmzArchive::maxEntrySize);
+        for (int i = 0; i < 4; ++i)
+            bytes[central + 24 + i] = char((limit >> (8 * i)) & 0xFF);
+        writeAll(big, bytes);
+        QVERIFY(!file.load(big));
+    }
+};
+
+QTEST_GUILESS_MAIN(TestKmz)
+#include "tst_kmz.moc"
