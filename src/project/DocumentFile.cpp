@@ -2,7 +2,7 @@
 
 #include "project/BackupSave.h"
 #include "project/PainterPathRenderer_Controller.h"
-#include "project/TrackImport.h"
+#include "project/TrackOpening.h"
 
 #include <QFileInfo>
 
@@ -53,7 +53,7 @@ DocumentOpenResult openDocumentFile(PainterPathRenderer_Controller &document, co
     }
 
     document.setKeyPointsFixed(true);
-    const TrackImportResult track = openTrackIntoDocument(document, fileName);
+    const TrackOpeningResult track = openTrackIntoDocument(document, fileName);
     if (!track.ok) {
         document.newProject();
         result.reason = QStringLiteral("neither a project nor a readable track: %1").arg(track.reason);
