@@ -6,6 +6,9 @@
 #include <QTemporaryDir>
 #include <QTest>
 
+#include <algorithm>
+#include <cmath>
+
 namespace {
 
 struct Run
@@ -83,6 +86,69 @@ private slots:
                  QStringLiteral("#0D0D0D"));
         QCOMPARE(doc.value(QStringLiteral("altitudePreset")).toObject().value(QStringLiteral("version")).toString(),
                  QStringLiteral("0.0.0.5"));
+    }
+
+    void trackConvertsIntoAProject()
+    {
+        QByteArray gpx = "<?xml version=\"1.0\"?>\n<gpx creator=\"logger\"><trk><trkseg>\n";
+        double west = 1e9, east = -1e9, south = 1e9, north = -1e9;
+        for (int i = 0; i < 4000; ++i) {
+            const QByteArray lat = QByteArray::number(47.0 + 0.3 * std::sin(i * 0.002), 'f', 7);
+            const QByteArray lon = QByteArray::number(9.0 + i * 0.0002, 'f', 7);
+            west = std::min(west, lon.toDouble());
+            east = std::max(east, lon.toDouble());
+            south = std::min(south, lat.toDouble());
+            north = std::max(north, lat.toDouble());
+            gpx += "<trkpt lat=\"" + lat + "\" lon=\"" + lon + "\"><ele>700</ele></trkpt>\n";
+        }
+        gpx += "</trkseg></trk></gpx>\n";
+        const QString track = path("alps.gpx");
+        writeText(track, gpx);
+
+        Run run = cli({QStringLiteral("project"), track});
+        QCOMPARE(run.exitCode, 0);
+        const QJsonObject opened = QJsonDocument::fromJson(run.out).object();
+        QCOMPARE(opened.value(QStringLiteral("kind")).toString(), QStringLiteral("track"));
+
+        const QString out = path("alps.zkgeo");
+        run = cli({QStringLiteral("convert"), track, QStringLiteral("-o"), out, QStringLiteral("--aliasing"), QStringLiteral("3")});
+        QCOMPARE(run.exitCode, 0);
+        const QJsonObject converted = QJsonDocument::fromJson(run.out).object();
+        QCOMPARE(converted.value(QStringLiteral("kind")).toString(), QStringLiteral("track"));
+        const int maxSamples = converted.value(QStringLiteral("curvePointCount")).toInt();
+        QVERIFY(maxSamples >= 4000);
+
+        run = cli({QStringLiteral("project"), out});
+        QCOMPARE(run.exitCode, 0);
+        const QJsonObject doc = QJsonDocument::fromJson(run.out).object();
+        QCOMPARE(doc.value(QStringLiteral("kind")).toString(), QStringLiteral("project"));
+        const QJsonObject pathObject = doc.value(QStringLiteral("path")).toObject();
+        QCOMPARE(pathObject.value(QStringLiteral("pathType")).toInt(), 2);
+        QCOMPARE(pathObject.value(QStringLiteral("curveMode")).toInt(), 1);
+        QCOMPARE(pathObject.value(QStringLiteral("keyPointCount")).toInt(), 2);
+        QCOMPARE(pathObject.value(QStringLiteral("curvePointCount")).toInt(), maxSamples);
+        QCOMPARE(pathObject.value(QStringLiteral("segments")).toArray().at(0).toObject().value(QStringLiteral("samples")).toInt(),
+                 maxSamples);
+        const QJsonObject first = pathObject.value(QStringLiteral("keyPoints")).toArray().at(0).toObject();
+        QCOMPARE(first.value(QStringLiteral("longitude")).toDouble(), 9.0);
+        QCOMPARE(first.value(QStringLiteral("durationToNextKP")).toInt(), 3 * maxSamples);
+        const QJsonObject fields = doc.value(QStringLiteral("fields")).toObject();
+        QCOMPARE(fields.value(QStringLiteral("visibleBoundariesTL/longitude")).toDouble(), west);
+        QCOMPARE(fields.value(QStringLiteral("visibleBoundariesTL/latitude")).toDouble(), north);
+        QCOMPARE(fields.value(QStringLiteral("visibleBoundariesBR/longitude")).toDouble(), east);
+        QCOMPARE(fields.value(QStringLiteral("visibleBoundariesBR/latitude")).toDouble(), south);
+        QCOMPARE(fields.value(QStringLiteral("centerPosition/longitude")).toDouble(), (west + east) / 2);
+        QCOMPARE(fields.value(QStringLiteral("centerPosition/latitude")).toDouble(), (south + north) / 2);
+
+        // Less thinning means more samples; a value out of the list is refused.
+        run = cli({QStringLiteral("convert"), track, QStringLiteral("-o"), path("thin.zkgeo"), QStringLiteral("--aliasing"),
+                   QStringLiteral("2")});
+        QCOMPARE(run.exitCode, 0);
+        QVERIFY(QJsonDocument::fromJson(run.out).object().value(QStringLiteral("curvePointCount")).toInt() < maxSamples);
+        run = cli({QStringLiteral("convert"), track, QStringLiteral("-o"), path("never.zkgeo"), QStringLiteral("--aliasing"),
+                   QStringLiteral("4")});
+        QVERIFY(run.exitCode != 0);
+        QVERIFY(!QFile::exists(path("never.zkgeo")));
     }
 
     void failuresNameTheFile()

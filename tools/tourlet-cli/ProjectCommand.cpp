@@ -150,7 +150,7 @@ int runConvert(const QStringList &arguments)
     if (cli::takeOption(args, QStringLiteral("--aliasing"), aliasingText, &error)) {
         bool ok = false;
         const uint aliasing = aliasingText.toUInt(&ok);
-        if (!ok)
+        if (!ok || aliasing > 3)
             return cli::fail(QStringLiteral("--aliasing wants 0 (off), 1 (auto), 2 (default) or 3 (max), not '%1'").arg(aliasingText));
         document.setGpxAliasing(aliasing);
     } else if (!error.isEmpty()) {
