@@ -50,7 +50,9 @@ bool QProjectController::createProjectFile(QString fileName)
         m_writeFailed = true;
         return true;
     }
-    startWriter(fileName);
+    m_newFile = std::make_unique<IniFileWriter>();
+    m_newFile->setValue(QStringLiteral("Header"), QStringLiteral("projecttype"), QString::fromLatin1(ProjectFormat::projectIdentifier));
+    m_newFile->setValue(QStringLiteral("Header"), QStringLiteral("projectversion"), QString::number(ProjectFormat::currentVersion));
     m_fileName = fileName;
     return true;
 }
@@ -72,15 +74,20 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
         return false;
     }
     m_fileName = fileName;
-    m_reader = std::make_unique<QSettings>(fileName, QSettings::IniFormat);
-    const QVariant type = m_reader->value(QStringLiteral("Header/projecttype"), QVariant());
-    const QString found = type.toString();
+    QFile file(fileName);
+    auto plain = std::make_unique<IniFileReader>();
+    if (file.open(QIODevice::ReadOnly) && plain->parse(file.readAll()))
+        m_plainFile = std::move(plain);
+    else
+        m_reader = std::make_unique<QSettings>(fileName, QSettings::IniFormat);
+    file.close();
+    const QString found = readProperty(QStringLiteral("Header"), QStringLiteral("projecttype"), QString());
     if (found != QLatin1String(ProjectFormat::projectIdentifier)) {
         logTrace(3, QStringLiteral("ProjectController::openProjectFile:%s - no valid projectfile - wrong projectFileIndentifier %s."),
                  fileName, found);
         return false;
     }
-    m_projectVersion = m_reader->value(QStringLiteral("Header/projectversion"), 0).toUInt();
+    m_projectVersion = readProperty(QStringLiteral("Header"), QStringLiteral("projectversion"), QString()).toUInt();
     if (m_projectVersion > ProjectFormat::highestAcceptedVersion) {
         logTrace(3, QStringLiteral("ProjectController::openProjectFile:%s - no valid projectfile - wrong projectVersion %d"),
                  fileName, m_projectVersion);
@@ -91,6 +98,10 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
 
 bool QProjectController::writeProperty(QString section, QString key, QString value)
 {
+    if (m_newFile) {
+        m_newFile->setValue(section, key, value);
+        return true;
+    }
     if (!m_writer) {
         logTrace(3, QStringLiteral("QProjectController::writeProperty[%s]: writer object doesn't exist"), m_fileName);
         m_writeFailed = true;
@@ -102,11 +113,29 @@ bool QProjectController::writeProperty(QString section, QString key, QString val
 
 QString QProjectController::readProperty(QString section, QString key, QString defaultValue)
 {
+    if (m_plainFile) {
+        QString value;
+        switch (m_plainFile->value(section, key, value)) {
+        case IniFileReader::Lookup::Found:
+            return value;
+        case IniFileReader::Lookup::Missing:
+            return defaultValue;
+        case IniFileReader::Lookup::NeedsStore:
+            break;
+        }
+        if (!m_reader)
+            m_reader = std::make_unique<QSettings>(m_fileName, QSettings::IniFormat);
+    }
     if (!m_reader) {
         logTrace(3, QStringLiteral("QProjectController::writeProperty: file %s doesn't exist"), m_fileName);
         return QString();
     }
-    const QVariant value = m_reader->value(address(section, key));
+    return storeValue(address(section, key), defaultValue);
+}
+
+QString QProjectController::storeValue(const QString &address, const QString &defaultValue)
+{
+    const QVariant value = m_reader->value(address);
     if (!value.isValid())
         return defaultValue;
     // A hand-edited line with unquoted commas reads as a list; keep its text.
@@ -117,6 +146,13 @@ QString QProjectController::readProperty(QString section, QString key, QString d
 
 bool QProjectController::closeProjectFile()
 {
+    if (m_newFile) {
+        if (!m_newFile->save(m_fileName)) {
+            logTrace(3, QStringLiteral("QProjectController::closeProjectFile[%s] - the file could not be written"), m_fileName);
+            m_writeFailed = true;
+        }
+        m_newFile.reset();
+    }
     // The writer is synced before it goes, so the next open in the same turn
     // sees the whole file.
     if (m_writer) {
@@ -128,5 +164,6 @@ bool QProjectController::closeProjectFile()
     }
     m_writer.reset();
     m_reader.reset();
+    m_plainFile.reset();
     return true;
 }
