@@ -1,5 +1,6 @@
 #include "project/IniFileWriter.h"
 
+#include <QBuffer>
 #include <QSaveFile>
 
 #include <algorithm>
@@ -9,9 +10,9 @@ namespace {
 
 const char hexDigits[] = "0123456789ABCDEF";
 
-void appendLowerHex(uint value, QByteArray &out)
+void appendLowerHex(uint value, std::string &out)
 {
-    out += QByteArray::number(value, 16);
+    out += QByteArray::number(value, 16).constData();
 }
 
 // The store's normal form of an address: no leading, trailing or doubled slashes.
@@ -31,7 +32,7 @@ QString normalized(const QString &address)
 
 } // namespace
 
-void IniFileWriter::escapeKey(const QString &key, QByteArray &out)
+void IniFileWriter::escapeKey(const QString &key, std::string &out)
 {
     for (const QChar qc : key) {
         uint ch = qc.unicode();
@@ -56,9 +57,26 @@ void IniFileWriter::escapeKey(const QString &key, QByteArray &out)
     }
 }
 
-void IniFileWriter::escapeValue(const QString &value, QByteArray &out)
+void IniFileWriter::escapeValue(const QString &value, std::string &out)
 {
-    const int start = out.size();
+    const size_t start = out.size();
+    // Most values are numbers or plain words: copied as they are.
+    {
+        const int length = value.size();
+        const QChar *text = value.unicode();
+        bool plain = length == 0 || (text[0] != QLatin1Char('@') && text[0] != QLatin1Char(' ') && text[length - 1] != QLatin1Char(' '));
+        for (int i = 0; plain && i < length; ++i) {
+            const ushort ch = text[i].unicode();
+            plain = ch >= 0x20 && ch < 0x7F && ch != '"' && ch != '\\' && ch != ';' && ch != ',' && ch != '=';
+        }
+        if (plain) {
+            out.resize(start + size_t(length));
+            char *d = &out[start];
+            for (int i = 0; i < length; ++i)
+                d[i] = char(text[i].unicode());
+            return;
+        }
+    }
     bool needsQuotes = false;
     bool escapeNextIfDigit = false;
     // A text that starts with '@' would read as a typed value: it is doubled. A
@@ -125,32 +143,32 @@ void IniFileWriter::escapeValue(const QString &value, QByteArray &out)
             }
         }
     }
-    if (needsQuotes || (start < out.size() && (out.at(start) == ' ' || out.at(out.size() - 1) == ' '))) {
-        out.insert(start, '"');
+    if (needsQuotes || (start < out.size() && (out[start] == ' ' || out.back() == ' '))) {
+        out.insert(start, 1, '"');
         out += '"';
     }
 }
 
-IniFileWriter::Section &IniFileWriter::section(const QString &name)
+uint32_t IniFileWriter::section(const QString &name)
 {
-    if (m_last < m_sections.size() && m_sections[m_last].name == name)
-        return m_sections[m_last];
+    if (m_last < m_sections.size() && m_sections[m_last] == name)
+        return m_last;
     const auto found = m_index.constFind(name);
     if (found != m_index.constEnd()) {
         m_last = *found;
     } else {
-        m_last = m_sections.size();
+        m_last = uint32_t(m_sections.size());
         m_index.insert(name, m_last);
-        m_sections.push_back(Section{name, {}});
+        m_sections.push_back(name);
     }
-    return m_sections[m_last];
+    return m_last;
 }
 
 void IniFileWriter::setValue(const QString &sectionName, const QString &key, const QString &value)
 {
     if (!sectionName.isEmpty() && !key.isEmpty() && !sectionName.contains(QLatin1Char('/'))
         && !key.startsWith(QLatin1Char('/')) && !key.endsWith(QLatin1Char('/')) && !key.contains(QLatin1String("//"))) {
-        section(sectionName).entries.emplace_back(key, value);
+        add(section(sectionName), key, value);
         return;
     }
     // Slashes make groups: the first part of the address is the section.
@@ -158,65 +176,173 @@ void IniFileWriter::setValue(const QString &sectionName, const QString &key, con
     if (address.isEmpty())
         return;
     const int slash = address.indexOf(QLatin1Char('/'));
-    if (slash < 0)
-        section(QString()).entries.emplace_back(address, value);
-    else
-        section(address.left(slash)).entries.emplace_back(address.mid(slash + 1), value);
+    add(section(slash < 0 ? QString() : address.left(slash)), slash < 0 ? address : address.mid(slash + 1), value);
 }
 
-QByteArray IniFileWriter::toBytes() const
-{
-    std::vector<const Section *> order;
-    order.reserve(m_sections.size());
-    size_t estimate = 0;
-    for (const Section &s : m_sections) {
-        order.push_back(&s);
-        estimate += 16 + s.entries.size() * 32;
-    }
-    std::sort(order.begin(), order.end(), [](const Section *a, const Section *b) { return a->name < b->name; });
+namespace {
 
-    QByteArray out;
-    out.reserve(int(std::min<size_t>(estimate, 1u << 30)));
-    std::vector<const std::pair<QString, QString> *> entries;
-    bool first = true;
-    for (const Section *s : order) {
-        if (!first)
+// Appends a key that needs no escape as it is; false (and nothing appended) otherwise.
+bool appendPlainKey(const QString &key, std::string &out)
+{
+    const int length = key.size();
+    const QChar *text = key.unicode();
+    for (int i = 0; i < length; ++i) {
+        const ushort ch = text[i].unicode();
+        if (!((ch >= 'a' && ch <= 'z') || (ch >= 'A' && ch <= 'Z') || (ch >= '0' && ch <= '9') || ch == '_' || ch == '-'
+              || ch == '.'))
+            return false;
+    }
+    const size_t start = out.size();
+    out.resize(start + size_t(length));
+    char *d = &out[start];
+    for (int i = 0; i < length; ++i)
+        d[i] = char(text[i].unicode());
+    return true;
+}
+
+} // namespace
+
+void IniFileWriter::add(uint32_t sectionIndex, const QString &key, const QString &value)
+{
+    const uint32_t offset = uint32_t(m_lines.size());
+    if (!appendPlainKey(key, m_lines)) {
+        escapeKey(key, m_lines);
+        m_oddKeys.emplace_back(offset, key);
+    }
+    m_lines += '=';
+    escapeValue(value, m_lines);
+    m_lines += '\n';
+    const uint32_t length = uint32_t(m_lines.size()) - offset;
+    if (!m_runs.empty() && m_runs.back().section == sectionIndex)
+        m_runs.back().length += length;
+    else
+        m_runs.push_back(Run{offset, length, sectionIndex});
+}
+
+QString IniFileWriter::keyOf(const Line &line) const
+{
+    const auto odd = std::lower_bound(m_oddKeys.begin(), m_oddKeys.end(), line.offset,
+                                      [](const std::pair<uint32_t, QString> &k, uint32_t offset) { return k.first < offset; });
+    if (odd != m_oddKeys.end() && odd->first == line.offset)
+        return odd->second;
+    return QString::fromLatin1(m_lines.data() + line.offset, int(line.keyLength));
+}
+
+// Keys sort as the texts they stand for; plain keys are their own bytes, and an
+// escaped key holds a '%' or '\', which no plain key does.
+bool IniFileWriter::keyLess(const Line &a, const Line &b) const
+{
+    const char *pa = m_lines.data() + a.offset;
+    const char *pb = m_lines.data() + b.offset;
+    if (!m_oddKeys.empty()
+        && (std::memchr(pa, '%', a.keyLength) || std::memchr(pa, '\\', a.keyLength) || std::memchr(pb, '%', b.keyLength)
+            || std::memchr(pb, '\\', b.keyLength)))
+        return keyOf(a) < keyOf(b);
+    const int c = std::memcmp(pa, pb, std::min(a.keyLength, b.keyLength));
+    return c < 0 || (c == 0 && a.keyLength < b.keyLength);
+}
+
+// Escaping is one to one, so equal keys have equal bytes.
+bool IniFileWriter::sameKey(const Line &a, const Line &b) const
+{
+    return a.keyLength == b.keyLength
+        && std::memcmp(m_lines.data() + a.offset, m_lines.data() + b.offset, a.keyLength) == 0;
+}
+
+bool IniFileWriter::writeTo(QIODevice &device) const
+{
+    std::vector<uint32_t> order(m_sections.size());
+    for (uint32_t i = 0; i < order.size(); ++i)
+        order[i] = i;
+    std::sort(order.begin(), order.end(), [this](uint32_t a, uint32_t b) { return m_sections[a] < m_sections[b]; });
+
+    // The runs grouped by section, each group in the order written.
+    std::vector<uint32_t> first(m_sections.size() + 1, 0);
+    for (const Run &r : m_runs)
+        ++first[r.section + 1];
+    for (size_t i = 1; i < first.size(); ++i)
+        first[i] += first[i - 1];
+    std::vector<uint32_t> grouped(m_runs.size());
+    {
+        std::vector<uint32_t> next(first.begin(), first.end() - 1);
+        for (uint32_t i = 0; i < m_runs.size(); ++i)
+            grouped[next[m_runs[i].section]++] = i;
+    }
+
+    constexpr size_t chunk = 1 << 22;
+    std::string out;
+    out.reserve(chunk + 4096);
+    std::vector<Line> lines;
+    const char *data = m_lines.data();
+    bool firstSection = true;
+    for (const uint32_t s : order) {
+        if (!firstSection)
             out += '\n';
-        first = false;
-        QByteArray heading;
-        escapeKey(s->name, heading);
-        if (heading.isEmpty())
+        firstSection = false;
+        std::string heading;
+        escapeKey(m_sections[s], heading);
+        if (heading.empty())
             out += "[General]";
-        else if (qstricmp(heading.constData(), "general") == 0)
+        else if (qstricmp(heading.c_str(), "general") == 0)
             out += "[%General]";
         else
             out += '[' + heading + ']';
         out += '\n';
 
-        entries.clear();
-        for (const auto &entry : s->entries)
-            entries.push_back(&entry);
+        // Values escape their line ends and keys their '=': both mark the line.
+        lines.clear();
+        for (uint32_t g = first[s]; g < first[s + 1]; ++g) {
+            const Run &run = m_runs[grouped[g]];
+            uint32_t pos = run.offset;
+            const uint32_t end = run.offset + run.length;
+            while (pos < end) {
+                const char *eq = static_cast<const char *>(std::memchr(data + pos, '=', end - pos));
+                const char *nl = static_cast<const char *>(std::memchr(eq, '\n', size_t(data + end - eq)));
+                const uint32_t next = uint32_t(nl - data) + 1;
+                lines.push_back(Line{pos, next - pos, uint32_t(eq - data) - pos});
+                pos = next;
+            }
+        }
         // Equal keys keep their order of writing; the last one written counts.
-        std::stable_sort(entries.begin(), entries.end(), [](const auto *a, const auto *b) { return a->first < b->first; });
-        for (size_t i = 0; i < entries.size(); ++i) {
-            if (i + 1 < entries.size() && entries[i + 1]->first == entries[i]->first)
+        const auto less = [this](const Line &a, const Line &b) { return keyLess(a, b); };
+        if (lines.size() > 32)
+            std::stable_sort(lines.begin(), lines.end(), less);
+        for (size_t i = 1; i < lines.size() && lines.size() <= 32; ++i) {
+            const Line line = lines[i];
+            size_t j = i;
+            for (; j > 0 && keyLess(line, lines[j - 1]); --j)
+                lines[j] = lines[j - 1];
+            lines[j] = line;
+        }
+        for (size_t i = 0; i < lines.size(); ++i) {
+            if (i + 1 < lines.size() && sameKey(lines[i + 1], lines[i]))
                 continue;
-            escapeKey(entries[i]->first, out);
-            out += '=';
-            escapeValue(entries[i]->second, out);
-            out += '\n';
+            out.append(data + lines[i].offset, lines[i].length);
+        }
+        if (out.size() >= chunk) {
+            if (device.write(out.data(), qint64(out.size())) != qint64(out.size()))
+                return false;
+            out.clear();
         }
     }
-    return out;
+    return device.write(out.data(), qint64(out.size())) == qint64(out.size());
+}
+
+QByteArray IniFileWriter::toBytes() const
+{
+    QByteArray bytes;
+    QBuffer buffer(&bytes);
+    buffer.open(QIODevice::WriteOnly);
+    writeTo(buffer);
+    return bytes;
 }
 
 bool IniFileWriter::save(const QString &fileName) const
 {
-    const QByteArray bytes = toBytes();
     QSaveFile file(fileName);
     if (!file.open(QIODevice::WriteOnly))
         return false;
-    if (file.write(bytes) != bytes.size()) {
+    if (!writeTo(file)) {
         file.cancelWriting();
         file.commit();
         return false;

@@ -1,10 +1,12 @@
 #pragma once
 
 #include <QByteArray>
+#include <QIODevice>
 #include <QHash>
 #include <QString>
 
-#include <utility>
+#include <cstdint>
+#include <string>
 #include <vector>
 
 // Collects "section/key" values and writes them as the settings ini format writes a
@@ -14,25 +16,43 @@ class IniFileWriter
 {
 public:
     void setValue(const QString &section, const QString &key, const QString &value);
-    bool isEmpty() const { return m_sections.empty(); }
+    bool isEmpty() const { return m_runs.empty(); }
 
     QByteArray toBytes() const;
+    bool writeTo(QIODevice &device) const;
     // Writes all at once through a temporary file; false when it isn't complete.
     bool save(const QString &fileName) const;
 
     // The escapes of the format, for keys (and section names) and for values.
-    static void escapeKey(const QString &key, QByteArray &out);
-    static void escapeValue(const QString &value, QByteArray &out);
+    static void escapeKey(const QString &key, std::string &out);
+    static void escapeValue(const QString &value, std::string &out);
 
 private:
-    struct Section
+    // Lines written one after the other into the same section. Each line is
+    // "key=value\n", escaped at once into the common buffer of all lines.
+    struct Run
     {
-        QString name;
-        std::vector<std::pair<QString, QString>> entries; // in the order written
+        uint32_t offset;
+        uint32_t length;
+        uint32_t section;
     };
-    Section &section(const QString &name);
+    struct Line
+    {
+        uint32_t offset;
+        uint32_t length;
+        uint32_t keyLength;
+    };
+    uint32_t section(const QString &name);
+    void add(uint32_t section, const QString &key, const QString &value);
+    QString keyOf(const Line &line) const;
+    bool keyLess(const Line &a, const Line &b) const;
+    bool sameKey(const Line &a, const Line &b) const;
 
-    std::vector<Section> m_sections;
-    QHash<QString, size_t> m_index;
-    size_t m_last = 0;
+    std::vector<QString> m_sections;
+    QHash<QString, uint32_t> m_index;
+    uint32_t m_last = 0;
+    std::vector<Run> m_runs; // in the order written
+    // Keys that needed escapes, by the offset of their line.
+    std::vector<std::pair<uint32_t, QString>> m_oddKeys;
+    std::string m_lines;
 };
