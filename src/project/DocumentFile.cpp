@@ -48,6 +48,7 @@ DocumentOpenResult openDocumentFile(PainterPathRenderer_Controller &document, co
             document.altitudePreset() = preset;
         // The theme's reader leaves the container open after a refused header.
         document.projectController().closeProjectFile();
+        document.projectController().forgetReadFile();
         result.status = DocumentOpenResult::Status::Project;
         return result;
     }

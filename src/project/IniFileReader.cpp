@@ -47,22 +47,105 @@ int hexValue(char c)
 
 } // namespace
 
+namespace {
+
+uint32_t hashBytes(const char *p, uint32_t length)
+{
+    uint32_t h = 2166136261u;
+    for (uint32_t i = 0; i < length; ++i)
+        h = (h ^ uchar(p[i])) * 16777619u;
+    return h;
+}
+
+// Latin-1 bytes of a name, false when it has characters beyond; no allocation for
+// the short names of sections and keys.
+bool latin1(const QString &text, char *buffer, int capacity, int &length)
+{
+    length = text.size();
+    if (length > capacity)
+        return false;
+    const QChar *c = text.unicode();
+    for (int i = 0; i < length; ++i) {
+        if (c[i].unicode() > 0xFF)
+            return false;
+        buffer[i] = char(c[i].unicode());
+    }
+    return true;
+}
+
+} // namespace
+
+const IniFileReader::Slot *IniFileReader::find(const char *name, uint32_t length) const
+{
+    if (m_slots.empty())
+        return nullptr;
+    const uint32_t h = hashBytes(name, length);
+    const size_t mask = m_slots.size() - 1;
+    for (size_t i = h & mask;; i = (i + 1) & mask) {
+        const Slot &s = m_slots[i];
+        if (s.name < 0)
+            return nullptr;
+        if (s.hash == h && s.nameLength == length && std::memcmp(m_data + s.name, name, length) == 0)
+            return &s;
+    }
+}
+
+bool IniFileReader::insert(qint64 name, uint32_t length, Slot *&slot)
+{
+    if ((m_used + 1) * 2 > m_slots.size()) {
+        std::vector<Slot> old(std::max<size_t>(m_slots.size() * 2, 1024));
+        old.swap(m_slots);
+        const size_t mask = m_slots.size() - 1;
+        for (const Slot &s : old) {
+            if (s.name < 0)
+                continue;
+            size_t i = s.hash & mask;
+            while (m_slots[i].name >= 0)
+                i = (i + 1) & mask;
+            m_slots[i] = s;
+        }
+    }
+    const uint32_t h = hashBytes(m_data + name, length);
+    const size_t mask = m_slots.size() - 1;
+    size_t i = h & mask;
+    for (; m_slots[i].name >= 0; i = (i + 1) & mask) {
+        const Slot &s = m_slots[i];
+        if (s.hash == h && s.nameLength == length && std::memcmp(m_data + s.name, m_data + name, length) == 0)
+            return false;
+    }
+    m_slots[i].name = name;
+    m_slots[i].nameLength = length;
+    m_slots[i].hash = h;
+    ++m_used;
+    slot = &m_slots[i];
+    return true;
+}
+
 bool IniFileReader::parse(const QByteArray &data)
 {
-    m_data = data;
-    m_sections.clear();
-    const char *p = m_data.constData();
-    const int size = m_data.size();
+    const QByteArray copy = data;
+    const bool ok = parse(copy.constData(), copy.size());
+    m_own = copy;
+    return ok;
+}
+
+bool IniFileReader::parse(const char *p, qint64 size)
+{
+    m_own.clear();
+    m_data = p;
+    m_size = size;
+    m_slots.clear();
+    m_used = 0;
+    m_cached = nullptr;
     if (size >= 3 && std::memcmp(p, "\xEF\xBB\xBF", 3) == 0)
         return false;
 
-    QByteArray current;
-    Range *range = nullptr;
-    int pos = 0;
+    Slot *range = nullptr;
+    qint64 pos = 0;
     while (pos < size) {
         const char *newline = static_cast<const char *>(std::memchr(p + pos, '\n', size_t(size - pos)));
-        const int lineEnd = newline ? int(newline - p) : size;
-        int start = pos;
+        const qint64 lineEnd = newline ? qint64(newline - p) : size;
+        qint64 start = pos;
         pos = lineEnd + 1;
         while (start < lineEnd && isSpace(p[start]))
             ++start;
@@ -70,30 +153,26 @@ bool IniFileReader::parse(const QByteArray &data)
             continue;
 
         if (p[start] == '[') {
-            const int nameLength = lineEnd - start - 2;
-            if (p[lineEnd - 1] != ']' || !isPlainName(p + start + 1, nameLength)
+            const qint64 nameLength = lineEnd - start - 2;
+            if (p[lineEnd - 1] != ']' || nameLength > 0xFFFF || !isPlainName(p + start + 1, int(nameLength))
                 || (nameLength == 7 && qstrnicmp(p + start + 1, "general", 7) == 0))
                 return false;
-            current = QByteArray::fromRawData(p + start + 1, nameLength);
-            if (m_sections.contains(current))
+            if (!insert(start + 1, uint32_t(nameLength), range))
                 return false;
-            range = &m_sections[current];
-            range->begin = range->end = start;
+            range->begin = range->end = lineEnd;
             continue;
         }
         if (!range)
             return false;
         const char *equals = static_cast<const char *>(std::memchr(p + start, '=', size_t(lineEnd - start)));
-        if (!equals || !isPlainName(p + start, int(equals - p) - start))
+        if (!equals || !isPlainName(p + start, int(equals - p - start)))
             return false;
         // The value: escapes stay on this line, quotes close on it, no comment follows.
         bool quoted = false;
-        for (int i = int(equals - p) + 1; i < lineEnd; ++i) {
+        for (qint64 i = qint64(equals - p) + 1; i < lineEnd; ++i) {
             const char c = p[i];
             if (c == '\\') {
-                if (++i >= lineEnd)
-                    return false;
-                if (p[i] == '\r')
+                if (++i >= lineEnd || p[i] == '\r')
                     return false;
             } else if (c == '"') {
                 quoted = !quoted;
@@ -103,6 +182,7 @@ bool IniFileReader::parse(const QByteArray &data)
         }
         if (quoted)
             return false;
+        // The table only grows at a section heading, so `range` is still its slot.
         range->end = lineEnd;
     }
     return true;
@@ -110,31 +190,39 @@ bool IniFileReader::parse(const QByteArray &data)
 
 IniFileReader::Lookup IniFileReader::value(const QString &section, const QString &key, QString &out) const
 {
-    const QByteArray sectionName = section.toLatin1();
-    const auto found = m_sections.constFind(sectionName);
-    if (found == m_sections.constEnd())
+    char sectionName[256], keyName[256];
+    int sectionLength = 0, keyLength = 0;
+    if (!latin1(section, sectionName, int(sizeof sectionName), sectionLength)
+        || !latin1(key, keyName, int(sizeof keyName), keyLength))
         return Lookup::Missing;
-    const QByteArray keyName = key.toLatin1();
-    if (QString::fromLatin1(keyName) != key)
+    const Slot *found = find(sectionName, uint32_t(sectionLength));
+    if (!found)
         return Lookup::Missing;
 
-    const char *p = m_data.constData();
-    int from = -1, to = -1;
-    int pos = found->begin;
-    while (pos < found->end) {
-        const char *newline = static_cast<const char *>(std::memchr(p + pos, '\n', size_t(found->end - pos)));
-        const int lineEnd = newline ? int(newline - p) : found->end;
-        int start = pos;
-        pos = lineEnd + 1;
-        while (start < lineEnd && isSpace(p[start]))
-            ++start;
-        if (start == lineEnd || p[start] == '[')
-            continue;
-        const int equals = int(static_cast<const char *>(std::memchr(p + start, '=', size_t(lineEnd - start))) - p);
-        // The last line of the key counts, as later values replace earlier ones.
-        if (equals - start == keyName.size() && std::memcmp(p + start, keyName.constData(), size_t(keyName.size())) == 0) {
-            from = equals + 1;
-            to = lineEnd;
+    const char *p = m_data;
+    if (m_cached != found) {
+        m_cached = found;
+        m_lines.clear();
+        qint64 pos = found->begin;
+        while (pos < found->end) {
+            const char *newline = static_cast<const char *>(std::memchr(p + pos, '\n', size_t(found->end - pos)));
+            const qint64 lineEnd = newline ? qint64(newline - p) : found->end;
+            qint64 start = pos;
+            pos = lineEnd + 1;
+            while (start < lineEnd && isSpace(p[start]))
+                ++start;
+            if (start == lineEnd)
+                continue;
+            const char *equals = static_cast<const char *>(std::memchr(p + start, '=', size_t(lineEnd - start)));
+            m_lines.push_back(Line{start, qint64(equals - p), lineEnd});
+        }
+    }
+    // The last line of the key counts, as later values replace earlier ones.
+    qint64 from = -1, to = -1;
+    for (const Line &line : m_lines) {
+        if (line.equals - line.key == keyLength && std::memcmp(p + line.key, keyName, size_t(keyLength)) == 0) {
+            from = line.equals + 1;
+            to = line.end;
         }
     }
     if (from < 0)
@@ -142,14 +230,14 @@ IniFileReader::Lookup IniFileReader::value(const QString &section, const QString
 
     // Most values are plain text: no escapes, quotes, lists or blanks at the ends.
     bool plain = to == from || (!isSpace(p[from]) && !isSpace(p[to - 1]));
-    for (int i = from; plain && i < to; ++i) {
+    for (qint64 i = from; plain && i < to; ++i) {
         const char c = p[i];
         plain = c != '\\' && c != '"' && c != ',' && uchar(c) < 0x80;
     }
     if (plain) {
         if (to > from && p[from] == '@')
             return Lookup::NeedsStore;
-        out = QString::fromLatin1(p + from, to - from);
+        out = QString::fromLatin1(p + from, int(to - from));
         return Lookup::Found;
     }
 
@@ -169,7 +257,7 @@ IniFileReader::Lookup IniFileReader::value(const QString &section, const QString
     return Lookup::Found;
 }
 
-bool IniFileReader::unescapeValue(const char *str, int from, int to, QString &text, QStringList &list)
+bool IniFileReader::unescapeValue(const char *str, qint64 from, qint64 to, QString &text, QStringList &list)
 {
     static const char escapeCodes[][2] = {{'a', '\a'}, {'b', '\b'}, {'f', '\f'}, {'n', '\n'}, {'r', '\r'}, {'t', '\t'},
                                           {'v', '\v'}, {'"', '"'},  {'?', '?'},  {'\'', '\''}, {'\\', '\\'}};
@@ -177,7 +265,7 @@ bool IniFileReader::unescapeValue(const char *str, int from, int to, QString &te
     bool chopAtEnd = true; // an escape cut off by the end keeps the blanks before it
     bool inQuotes = false;
     bool currentQuoted = false;
-    int i = from;
+    qint64 i = from;
     int chopLimit = 0;
 
     auto skipSpaces = [&] {
@@ -249,10 +337,10 @@ bool IniFileReader::unescapeValue(const char *str, int from, int to, QString &te
             skipSpaces();
             chopLimit = text.size();
         } else {
-            int j = i + 1;
+            qint64 j = i + 1;
             while (j < to && str[j] != '\\' && str[j] != '"' && str[j] != ',')
                 ++j;
-            text += QString::fromLatin1(str + i, j - i);
+            text += QString::fromLatin1(str + i, int(j - i));
             i = j;
         }
     }

@@ -1,8 +1,11 @@
 #pragma once
 
 #include <QByteArray>
-#include <QHash>
 #include <QString>
+#include <QStringList>
+
+#include <cstdint>
+#include <vector>
 
 // Reads the settings ini format as QSettings::IniFormat reads it, for the files that
 // this program writes and files of the same plain shape. `parse` declines (false)
@@ -14,6 +17,8 @@ class IniFileReader
 public:
     enum class Lookup { Found, Missing, NeedsStore };
 
+    // The bytes must stay valid while the reader is used.
+    bool parse(const char *data, qint64 size);
     bool parse(const QByteArray &data);
 
     // The value as text, lists joined with ','. NeedsStore for a value that reads as
@@ -21,15 +26,32 @@ public:
     Lookup value(const QString &section, const QString &key, QString &out) const;
 
     // The value part of a line, unescaped and unquoted; true when it holds a list.
-    static bool unescapeValue(const char *data, int from, int to, QString &text, QStringList &list);
+    static bool unescapeValue(const char *data, qint64 from, qint64 to, QString &text, QStringList &list);
 
 private:
-    struct Range
+    struct Slot
     {
-        int begin = 0;
-        int end = 0;
+        qint64 name = -1; // offset of the section's name, -1 for an empty slot
+        qint64 begin = 0; // its lines
+        qint64 end = 0;
+        uint32_t nameLength = 0;
+        uint32_t hash = 0;
     };
+    struct Line
+    {
+        qint64 key;
+        qint64 equals;
+        qint64 end;
+    };
+    const Slot *find(const char *name, uint32_t length) const;
+    bool insert(qint64 name, uint32_t length, Slot *&slot);
 
-    QByteArray m_data;
-    QHash<QByteArray, Range> m_sections;
+    QByteArray m_own;
+    const char *m_data = nullptr;
+    qint64 m_size = 0;
+    std::vector<Slot> m_slots;
+    size_t m_used = 0;
+    // The lines of the section read last: a record's keys are read one after another.
+    mutable const Slot *m_cached = nullptr;
+    mutable std::vector<Line> m_lines;
 };

@@ -2,7 +2,9 @@
 
 #include "app/Trace.h"
 
+#include <QDateTime>
 #include <QFile>
+#include <QFileInfo>
 #include <QSettings>
 #include <QStringList>
 
@@ -35,6 +37,7 @@ bool QProjectController::createProjectFile(QString fileName)
         return false;
     }
     m_writeFailed = false;
+    forgetReadFile();
     // The old file goes before the new one is written: callers that must not
     // lose it keep their own copy first.
     if (QFile::exists(fileName))
@@ -65,6 +68,7 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
     }
     m_writeFailed = false;
     if (!forLoad) {
+        forgetReadFile();
         m_fileName = fileName;
         startWriter(fileName);
         return true;
@@ -74,13 +78,24 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
         return false;
     }
     m_fileName = fileName;
-    QFile file(fileName);
-    auto plain = std::make_unique<IniFileReader>();
-    if (file.open(QIODevice::ReadOnly) && plain->parse(file.readAll()))
-        m_plainFile = std::move(plain);
-    else
-        m_reader = std::make_unique<QSettings>(fileName, QSettings::IniFormat);
-    file.close();
+    const QFileInfo info(fileName);
+    const qint64 modified = info.lastModified().toMSecsSinceEpoch();
+    if (m_lastRead.reader && m_lastRead.name == info.absoluteFilePath() && m_lastRead.size == info.size()
+        && m_lastRead.modified == modified) {
+        m_plainFile = std::move(m_lastRead.reader);
+    } else {
+        forgetReadFile();
+        QFile file(fileName);
+        auto plain = std::make_unique<IniFileReader>();
+        if (file.open(QIODevice::ReadOnly) && plain->parse(file.readAll())) {
+            m_plainFile = std::move(plain);
+            m_lastRead.name = info.absoluteFilePath();
+            m_lastRead.size = info.size();
+            m_lastRead.modified = modified;
+        } else {
+            m_reader = std::make_unique<QSettings>(fileName, QSettings::IniFormat);
+        }
+    }
     const QString found = readProperty(QStringLiteral("Header"), QStringLiteral("projecttype"), QString());
     if (found != QLatin1String(ProjectFormat::projectIdentifier)) {
         logTrace(3, QStringLiteral("ProjectController::openProjectFile:%s - no valid projectfile - wrong projectFileIndentifier %s."),
@@ -164,6 +179,12 @@ bool QProjectController::closeProjectFile()
     }
     m_writer.reset();
     m_reader.reset();
-    m_plainFile.reset();
+    if (m_plainFile)
+        m_lastRead.reader = std::move(m_plainFile);
     return true;
+}
+
+void QProjectController::forgetReadFile()
+{
+    m_lastRead = ReadFile();
 }

@@ -29,6 +29,11 @@ public:
     bool isWriting() const { return m_writer != nullptr || m_newFile != nullptr; }
     bool isReading() const { return m_reader != nullptr || m_plainFile != nullptr; }
 
+    // A file read is kept after its close, so that reading the same unchanged file
+    // again (the altitude theme after the project) doesn't parse it twice. This lets
+    // it go.
+    void forgetReadFile();
+
     // Whether anything of the last write went wrong: no file could be made, a
     // property met no writer, or the store could not put the file on disk.
     // Cleared by the next create or open.
@@ -42,5 +47,13 @@ private:
     std::unique_ptr<QSettings> m_reader;
     std::unique_ptr<IniFileWriter> m_newFile;
     std::unique_ptr<IniFileReader> m_plainFile;
+    struct ReadFile
+    {
+        QString name;
+        qint64 size = -1;
+        qint64 modified = 0;
+        std::unique_ptr<IniFileReader> reader;
+    };
+    ReadFile m_lastRead;
     bool m_writeFailed = false;
 };

@@ -235,6 +235,32 @@ private slots:
         }
     }
 
+    void rereadsAChangedFile()
+    {
+        const QString file = m_dir.filePath(QStringLiteral("changing.ini"));
+        const QByteArray header = "[Header]\nprojecttype=ZKGEO\nprojectversion=2\n";
+        writeBytes(file, header + "[a]\nx=1\n");
+        QProjectController container;
+        QVERIFY(container.openProjectFile(file, true));
+        QCOMPARE(container.readProperty(QStringLiteral("a"), QStringLiteral("x"), QString()), QStringLiteral("1"));
+        container.closeProjectFile();
+        // Read again unchanged, then after another program changed it.
+        QVERIFY(container.openProjectFile(file, true));
+        QCOMPARE(container.readProperty(QStringLiteral("a"), QStringLiteral("x"), QString()), QStringLiteral("1"));
+        container.closeProjectFile();
+        writeBytes(file, header + "[a]\nx=22\n");
+        QVERIFY(container.openProjectFile(file, true));
+        QCOMPARE(container.readProperty(QStringLiteral("a"), QStringLiteral("x"), QString()), QStringLiteral("22"));
+        container.closeProjectFile();
+        // Written through the container itself.
+        QVERIFY(container.createProjectFile(file));
+        container.writeProperty(QStringLiteral("a"), QStringLiteral("x"), QStringLiteral("3"));
+        container.closeProjectFile();
+        QVERIFY(container.openProjectFile(file, true));
+        QCOMPARE(container.readProperty(QStringLiteral("a"), QStringLiteral("x"), QString()), QStringLiteral("3"));
+        container.closeProjectFile();
+    }
+
     void failedWriteIsReported()
     {
         QProjectController container;
