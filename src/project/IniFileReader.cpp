@@ -129,9 +129,18 @@ bool IniFileReader::parse(const QByteArray &data)
     return ok;
 }
 
+bool IniFileReader::parse(LargeBuffer &&data)
+{
+    LargeBuffer own = std::move(data);
+    const bool ok = parse(own.data(), qint64(own.size()));
+    m_ownLarge = std::move(own);
+    return ok;
+}
+
 bool IniFileReader::parse(const char *p, qint64 size)
 {
     m_own.clear();
+    m_ownLarge = LargeBuffer();
     m_data = p;
     m_size = size;
     m_slots.clear();

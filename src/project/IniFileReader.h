@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/LargeBuffer.h"
+
 #include <QByteArray>
 #include <QString>
 #include <QStringList>
@@ -20,6 +22,7 @@ public:
     // The bytes must stay valid while the reader is used.
     bool parse(const char *data, qint64 size);
     bool parse(const QByteArray &data);
+    bool parse(LargeBuffer &&data);
 
     // The value as text, lists joined with ','. NeedsStore for a value that reads as
     // a typed one (a leading '@'), which only the store itself knows how to convert.
@@ -47,6 +50,7 @@ private:
     bool insert(qint64 name, uint32_t length, Slot *&slot);
 
     QByteArray m_own;
+    LargeBuffer m_ownLarge;
     const char *m_data = nullptr;
     qint64 m_size = 0;
     std::vector<Slot> m_slots;

@@ -205,14 +205,19 @@ bool appendPlainKey(const QString &key, std::string &out)
 void IniFileWriter::add(uint32_t sectionIndex, const QString &key, const QString &value)
 {
     const uint32_t offset = uint32_t(m_lines.size());
-    if (!appendPlainKey(key, m_lines)) {
-        escapeKey(key, m_lines);
+    m_scratch.clear();
+    if (!appendPlainKey(key, m_scratch)) {
+        escapeKey(key, m_scratch);
         m_oddKeys.emplace_back(offset, key);
     }
-    m_lines += '=';
-    escapeValue(value, m_lines);
-    m_lines += '\n';
-    const uint32_t length = uint32_t(m_lines.size()) - offset;
+    m_scratch += '=';
+    escapeValue(value, m_scratch);
+    m_scratch += '\n';
+    if (!m_lines.append(m_scratch.data(), m_scratch.size())) {
+        m_failed = true;
+        return;
+    }
+    const uint32_t length = uint32_t(m_scratch.size());
     if (!m_runs.empty() && m_runs.back().section == sectionIndex)
         m_runs.back().length += length;
     else
@@ -339,6 +344,8 @@ QByteArray IniFileWriter::toBytes() const
 
 bool IniFileWriter::save(const QString &fileName) const
 {
+    if (m_failed)
+        return false;
     QSaveFile file(fileName);
     if (!file.open(QIODevice::WriteOnly))
         return false;

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/LargeBuffer.h"
+
 #include <QByteArray>
 #include <QIODevice>
 #include <QHash>
@@ -54,5 +56,7 @@ private:
     std::vector<Run> m_runs; // in the order written
     // Keys that needed escapes, by the offset of their line.
     std::vector<std::pair<uint32_t, QString>> m_oddKeys;
-    std::string m_lines;
+    LargeBuffer m_lines;
+    bool m_failed = false; // no memory for a line
+    std::string m_scratch;
 };

@@ -9,6 +9,28 @@
 #include <QStringList>
 
 namespace {
+
+// The file's bytes in one piece; empty when it can't be read.
+LargeBuffer readWholeFile(const QString &fileName)
+{
+    LargeBuffer bytes;
+    QFile file(fileName);
+    if (!file.open(QIODevice::ReadOnly))
+        return bytes;
+    const qint64 size = file.size();
+    if (size <= 0 || !bytes.reserve(size_t(size)))
+        return bytes;
+    qint64 got = 0;
+    while (got < size) {
+        const qint64 n = file.read(bytes.data() + got, size - got);
+        if (n <= 0)
+            break;
+        got += n;
+    }
+    bytes.resize(size_t(got));
+    return bytes;
+}
+
 QString address(const QString &section, const QString &key)
 {
     return QStringLiteral("%1/%2").arg(section, key);
@@ -85,9 +107,8 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
         m_plainFile = std::move(m_lastRead.reader);
     } else {
         forgetReadFile();
-        QFile file(fileName);
         auto plain = std::make_unique<IniFileReader>();
-        if (file.open(QIODevice::ReadOnly) && plain->parse(file.readAll())) {
+        if (plain->parse(readWholeFile(fileName))) {
             m_plainFile = std::move(plain);
             m_lastRead.name = info.absoluteFilePath();
             m_lastRead.size = info.size();
