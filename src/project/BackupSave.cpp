@@ -17,8 +17,10 @@ bool saveWithBackup(const QString &fileName, const std::function<bool()> &write)
     if (haveBackup) {
         logTrace(1, QStringLiteral("saveWithBackup[%s] - keeping the backup of an unfinished save"), backup);
     } else if (QFile::exists(fileName) || QFileInfo::exists(backup)) {
+        // The writer makes the file anew, so the previous one itself can be the
+        // copy: moved aside, not duplicated byte by byte.
         QFile original(fileName);
-        if (!original.copy(backup)) {
+        if (!original.rename(backup)) {
             // Without a copy the old file would be gone before the new one is written.
             logTrace(3, QStringLiteral("saveWithBackup[%s] - can't keep a copy as %s: %s; nothing saved"), fileName, backup,
                      original.errorString());
