@@ -1,6 +1,7 @@
 #include "project/IniFileWriter.h"
 
 #include <QBuffer>
+#include <QHash>
 #include <QSaveFile>
 
 #include <algorithm>
@@ -153,14 +154,31 @@ uint32_t IniFileWriter::section(const QString &name)
 {
     if (m_last < m_sections.size() && m_sections[m_last] == name)
         return m_last;
-    const auto found = m_index.constFind(name);
-    if (found != m_index.constEnd()) {
-        m_last = *found;
-    } else {
-        m_last = uint32_t(m_sections.size());
-        m_index.insert(name, m_last);
-        m_sections.push_back(name);
+    const uint32_t h = qHash(name);
+    if ((m_sections.size() + 1) * 2 > m_table.size()) {
+        std::vector<std::pair<uint32_t, uint32_t>> old(std::max<size_t>(m_table.size() * 2, 256));
+        old.swap(m_table);
+        const size_t mask = m_table.size() - 1;
+        for (const auto &slot : old) {
+            if (!slot.first)
+                continue;
+            size_t i = slot.second & mask;
+            while (m_table[i].first)
+                i = (i + 1) & mask;
+            m_table[i] = slot;
+        }
     }
+    const size_t mask = m_table.size() - 1;
+    size_t i = h & mask;
+    for (; m_table[i].first; i = (i + 1) & mask) {
+        if (m_table[i].second == h && m_sections[m_table[i].first - 1] == name) {
+            m_last = m_table[i].first - 1;
+            return m_last;
+        }
+    }
+    m_last = uint32_t(m_sections.size());
+    m_sections.push_back(name);
+    m_table[i] = {m_last + 1, h};
     return m_last;
 }
 

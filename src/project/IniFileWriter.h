@@ -4,7 +4,6 @@
 
 #include <QByteArray>
 #include <QIODevice>
-#include <QHash>
 #include <QString>
 
 #include <cstdint>
@@ -51,7 +50,8 @@ private:
     bool sameKey(const Line &a, const Line &b) const;
 
     std::vector<QString> m_sections;
-    QHash<QString, uint32_t> m_index;
+    // Open addressing over m_sections: 1 + index, 0 for a free slot, and the hash.
+    std::vector<std::pair<uint32_t, uint32_t>> m_table;
     uint32_t m_last = 0;
     std::vector<Run> m_runs; // in the order written
     // Keys that needed escapes, by the offset of their line.
