@@ -75,49 +75,49 @@ bool latin1(const QString &text, char *buffer, int capacity, int &length)
 
 } // namespace
 
-const IniFileReader::Slot *IniFileReader::find(const char *name, uint32_t length) const
+const IniFileReader::Section *IniFileReader::find(const char *name, uint32_t length) const
 {
-    if (m_slots.empty())
+    if (m_table.empty())
         return nullptr;
     const uint32_t h = hashBytes(name, length);
-    const size_t mask = m_slots.size() - 1;
-    for (size_t i = h & mask;; i = (i + 1) & mask) {
-        const Slot &s = m_slots[i];
-        if (s.name < 0)
-            return nullptr;
-        if (s.hash == h && s.nameLength == length && std::memcmp(m_data + s.name, name, length) == 0)
+    const size_t mask = m_table.size() - 1;
+    for (size_t i = h & mask; m_table[i].second; i = (i + 1) & mask) {
+        if (m_table[i].first != h)
+            continue;
+        const Section &s = m_sections[m_table[i].second - 1];
+        if (s.nameLength == length && std::memcmp(m_data + s.name, name, length) == 0)
             return &s;
     }
+    return nullptr;
 }
 
-bool IniFileReader::insert(qint64 name, uint32_t length, Slot *&slot)
+bool IniFileReader::insert(qint64 name, uint32_t length)
 {
-    if ((m_used + 1) * 2 > m_slots.size()) {
-        std::vector<Slot> old(std::max<size_t>(m_slots.size() * 2, 1024));
-        old.swap(m_slots);
-        const size_t mask = m_slots.size() - 1;
-        for (const Slot &s : old) {
-            if (s.name < 0)
+    if ((m_sections.size() + 1) * 2 > m_table.size()) {
+        std::vector<std::pair<uint32_t, uint32_t>> old(std::max<size_t>(m_table.size() * 2, 1024));
+        old.swap(m_table);
+        const size_t mask = m_table.size() - 1;
+        for (const auto &slot : old) {
+            if (!slot.second)
                 continue;
-            size_t i = s.hash & mask;
-            while (m_slots[i].name >= 0)
+            size_t i = slot.first & mask;
+            while (m_table[i].second)
                 i = (i + 1) & mask;
-            m_slots[i] = s;
+            m_table[i] = slot;
         }
     }
     const uint32_t h = hashBytes(m_data + name, length);
-    const size_t mask = m_slots.size() - 1;
+    const size_t mask = m_table.size() - 1;
     size_t i = h & mask;
-    for (; m_slots[i].name >= 0; i = (i + 1) & mask) {
-        const Slot &s = m_slots[i];
-        if (s.hash == h && s.nameLength == length && std::memcmp(m_data + s.name, m_data + name, length) == 0)
+    for (; m_table[i].second; i = (i + 1) & mask) {
+        if (m_table[i].first != h)
+            continue;
+        const Section &s = m_sections[m_table[i].second - 1];
+        if (s.nameLength == length && std::memcmp(m_data + s.name, m_data + name, length) == 0)
             return false;
     }
-    m_slots[i].name = name;
-    m_slots[i].nameLength = length;
-    m_slots[i].hash = h;
-    ++m_used;
-    slot = &m_slots[i];
+    m_sections.push_back(Section{name, 0, 0, length});
+    m_table[i] = {h, uint32_t(m_sections.size())};
     return true;
 }
 
@@ -143,13 +143,13 @@ bool IniFileReader::parse(const char *p, qint64 size)
     m_ownLarge = LargeBuffer();
     m_data = p;
     m_size = size;
-    m_slots.clear();
-    m_used = 0;
+    m_sections.clear();
+    m_table.clear();
     m_cached = nullptr;
     if (size >= 3 && std::memcmp(p, "\xEF\xBB\xBF", 3) == 0)
         return false;
 
-    Slot *range = nullptr;
+    Section *range = nullptr;
     qint64 pos = 0;
     while (pos < size) {
         const char *newline = static_cast<const char *>(std::memchr(p + pos, '\n', size_t(size - pos)));
@@ -166,8 +166,9 @@ bool IniFileReader::parse(const char *p, qint64 size)
             if (p[lineEnd - 1] != ']' || nameLength > 0xFFFF || !isPlainName(p + start + 1, int(nameLength))
                 || (nameLength == 7 && qstrnicmp(p + start + 1, "general", 7) == 0))
                 return false;
-            if (!insert(start + 1, uint32_t(nameLength), range))
+            if (!insert(start + 1, uint32_t(nameLength)))
                 return false;
+            range = &m_sections.back();
             range->begin = range->end = lineEnd;
             continue;
         }
@@ -191,7 +192,7 @@ bool IniFileReader::parse(const char *p, qint64 size)
         }
         if (quoted)
             return false;
-        // The table only grows at a section heading, so `range` is still its slot.
+        // Sections are only added at a heading, so `range` is still the current one.
         range->end = lineEnd;
     }
     return true;
@@ -204,7 +205,7 @@ IniFileReader::Lookup IniFileReader::value(const QString &section, const QString
     if (!latin1(section, sectionName, int(sizeof sectionName), sectionLength)
         || !latin1(key, keyName, int(sizeof keyName), keyLength))
         return Lookup::Missing;
-    const Slot *found = find(sectionName, uint32_t(sectionLength));
+    const Section *found = find(sectionName, uint32_t(sectionLength));
     if (!found)
         return Lookup::Missing;
 

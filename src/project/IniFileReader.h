@@ -32,13 +32,12 @@ public:
     static bool unescapeValue(const char *data, qint64 from, qint64 to, QString &text, QStringList &list);
 
 private:
-    struct Slot
+    struct Section
     {
-        qint64 name = -1; // offset of the section's name, -1 for an empty slot
-        qint64 begin = 0; // its lines
-        qint64 end = 0;
-        uint32_t nameLength = 0;
-        uint32_t hash = 0;
+        qint64 name;  // offset of the section's name
+        qint64 begin; // its lines
+        qint64 end;
+        uint32_t nameLength;
     };
     struct Line
     {
@@ -46,16 +45,17 @@ private:
         qint64 equals;
         qint64 end;
     };
-    const Slot *find(const char *name, uint32_t length) const;
-    bool insert(qint64 name, uint32_t length, Slot *&slot);
+    const Section *find(const char *name, uint32_t length) const;
+    bool insert(qint64 name, uint32_t length);
 
     QByteArray m_own;
     LargeBuffer m_ownLarge;
     const char *m_data = nullptr;
     qint64 m_size = 0;
-    std::vector<Slot> m_slots;
-    size_t m_used = 0;
+    std::vector<Section> m_sections;
+    // Open addressing over m_sections: the name's hash and 1 + index, 0 for a free slot.
+    std::vector<std::pair<uint32_t, uint32_t>> m_table;
     // The lines of the section read last: a record's keys are read one after another.
-    mutable const Slot *m_cached = nullptr;
+    mutable const Section *m_cached = nullptr;
     mutable std::vector<Line> m_lines;
 };
