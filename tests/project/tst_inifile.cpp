@@ -168,7 +168,7 @@ private slots:
             // values with escapes the store never writes.
             if (round % 3 == 1) {
                 bytes += "\n  [hand]\n\tlist=a, b ,\"c, d\" , e\nx=\\x41\\101\\q\\\"z\\ \nquoted=\"  a \"  \n"
-                         "at=@@twice\nlate=1\nlate=2\nraw=caf\xe9\nempty=\ncut=ab  \\x\n";
+                         "at=@@twice\nlate=1\nlate=2\nraw=caf\xe9\nempty=\ncut=ab  \\x\neq=a=b=c\nsemi=\"a;b\" \nblank=   \n";
             }
             writeBytes(file, bytes);
 
@@ -180,7 +180,7 @@ private slots:
             QSettings store(file, QSettings::IniFormat);
             std::vector<std::pair<QString, QString>> addresses = {
                 {"hand", "list"}, {"hand", "x"}, {"hand", "quoted"}, {"hand", "at"}, {"hand", "late"},
-                {"hand", "raw"}, {"hand", "empty"}, {"hand", "cut"}, {"Header", "projectversion"},
+                {"hand", "raw"}, {"hand", "empty"}, {"hand", "cut"}, {"hand", "eq"}, {"hand", "semi"}, {"hand", "blank"}, {"Header", "projectversion"},
                 {"Header", "none"}, {"nowhere", "x"}, {"", "x"}, {"hand", "a/b"}, {"\u00e4", "x"}};
             for (const Entry &e : entries)
                 addresses.emplace_back(std::get<0>(e), std::get<1>(e));
