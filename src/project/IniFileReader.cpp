@@ -205,7 +205,12 @@ IniFileReader::Lookup IniFileReader::value(const QString &section, const QString
     if (!latin1(section, sectionName, int(sizeof sectionName), sectionLength)
         || !latin1(key, keyName, int(sizeof keyName), keyLength))
         return Lookup::Missing;
-    const Section *found = find(sectionName, uint32_t(sectionLength));
+    // A record's keys are read one after another: most lookups stay in the section
+    // of the one before.
+    const Section *found = m_cached;
+    if (!found || found->nameLength != uint32_t(sectionLength)
+        || std::memcmp(m_data + found->name, sectionName, size_t(sectionLength)) != 0)
+        found = find(sectionName, uint32_t(sectionLength));
     if (!found)
         return Lookup::Missing;
 

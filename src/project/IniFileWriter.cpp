@@ -185,7 +185,7 @@ uint32_t IniFileWriter::section(const QString &name)
 void IniFileWriter::setValue(const QString &sectionName, const QString &key, const QString &value)
 {
     if (!sectionName.isEmpty() && !key.isEmpty() && !sectionName.contains(QLatin1Char('/'))
-        && !key.startsWith(QLatin1Char('/')) && !key.endsWith(QLatin1Char('/')) && !key.contains(QLatin1String("//"))) {
+        && !key.contains(QLatin1Char('/'))) {
         add(section(sectionName), key, value);
         return;
     }
