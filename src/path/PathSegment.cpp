@@ -116,7 +116,7 @@ void PathSegment::remapCorrespondingIds(const std::vector<KeyPoint> &keyPoints, 
 
 QString PathSegment::sampleSection(const QString &section, int index)
 {
-    return QStringLiteral("%1curvepoint%2").arg(section).arg(index);
+    return section + QLatin1String("curvepoint") + QString::number(index);
 }
 
 void PathSegment::saveHeader(ProjectController &store, const QString &section) const
@@ -133,10 +133,11 @@ bool PathSegment::Load(ProjectController &store, const QString &section)
     curvePoints.clear();
     for (int i = 0; i < count; ++i) {
         // A damaged count must not make up samples: the list ends at its first missing record.
-        if (store.readProperty(sampleSection(section, i), key("x"), QString()).isEmpty())
+        const QString sample = sampleSection(section, i);
+        if (store.readProperty(sample, key("x"), QString()).isEmpty())
             break;
         CurvePoint p;
-        p.Load(store, sampleSection(section, i));
+        p.Load(store, sample);
         curvePoints.push_back(p);
     }
     return true;

@@ -2,11 +2,35 @@
 
 #include "app/Trace.h"
 
+#include <QDateTime>
 #include <QFile>
+#include <QFileInfo>
 #include <QSettings>
 #include <QStringList>
 
 namespace {
+
+// The file's bytes in one piece; empty when it can't be read.
+LargeBuffer readWholeFile(const QString &fileName)
+{
+    LargeBuffer bytes;
+    QFile file(fileName);
+    if (!file.open(QIODevice::ReadOnly))
+        return bytes;
+    const qint64 size = file.size();
+    if (size <= 0 || !bytes.reserve(size_t(size)))
+        return bytes;
+    qint64 got = 0;
+    while (got < size) {
+        const qint64 n = file.read(bytes.data() + got, size - got);
+        if (n <= 0)
+            break;
+        got += n;
+    }
+    bytes.resize(size_t(got));
+    return bytes;
+}
+
 QString address(const QString &section, const QString &key)
 {
     return QStringLiteral("%1/%2").arg(section, key);
@@ -34,6 +58,8 @@ bool QProjectController::createProjectFile(QString fileName)
         logTrace(3, QStringLiteral("QProjectController::createProjectFile[%s] - writer/reader object always created"), fileName);
         return false;
     }
+    m_writeFailed = false;
+    forgetReadFile();
     // The old file goes before the new one is written: callers that must not
     // lose it keep their own copy first.
     if (QFile::exists(fileName))
@@ -46,9 +72,12 @@ bool QProjectController::createProjectFile(QString fileName)
     if (!QFile::exists(fileName)) {
         logTrace(3, QStringLiteral("QProjectController::createProjectFile: can't create file %s"), fileName);
         m_fileName.clear();
+        m_writeFailed = true;
         return true;
     }
-    startWriter(fileName);
+    m_newFile = std::make_unique<IniFileWriter>();
+    m_newFile->setValue(QStringLiteral("Header"), QStringLiteral("projecttype"), QString::fromLatin1(ProjectFormat::projectIdentifier));
+    m_newFile->setValue(QStringLiteral("Header"), QStringLiteral("projectversion"), QString::number(ProjectFormat::currentVersion));
     m_fileName = fileName;
     return true;
 }
@@ -59,7 +88,9 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
         logTrace(3, QStringLiteral("QProjectController::openProjectFile[%s] - writer/reader object always created"), fileName);
         return false;
     }
+    m_writeFailed = false;
     if (!forLoad) {
+        forgetReadFile();
         m_fileName = fileName;
         startWriter(fileName);
         return true;
@@ -69,15 +100,30 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
         return false;
     }
     m_fileName = fileName;
-    m_reader = std::make_unique<QSettings>(fileName, QSettings::IniFormat);
-    const QVariant type = m_reader->value(QStringLiteral("Header/projecttype"), QVariant());
-    const QString found = type.toString();
+    const QFileInfo info(fileName);
+    const qint64 modified = info.lastModified().toMSecsSinceEpoch();
+    if (m_lastRead.reader && m_lastRead.name == info.absoluteFilePath() && m_lastRead.size == info.size()
+        && m_lastRead.modified == modified) {
+        m_plainFile = std::move(m_lastRead.reader);
+    } else {
+        forgetReadFile();
+        auto plain = std::make_unique<IniFileReader>();
+        if (plain->parse(readWholeFile(fileName))) {
+            m_plainFile = std::move(plain);
+            m_lastRead.name = info.absoluteFilePath();
+            m_lastRead.size = info.size();
+            m_lastRead.modified = modified;
+        } else {
+            m_reader = std::make_unique<QSettings>(fileName, QSettings::IniFormat);
+        }
+    }
+    const QString found = readProperty(QStringLiteral("Header"), QStringLiteral("projecttype"), QString());
     if (found != QLatin1String(ProjectFormat::projectIdentifier)) {
         logTrace(3, QStringLiteral("ProjectController::openProjectFile:%s - no valid projectfile - wrong projectFileIndentifier %s."),
                  fileName, found);
         return false;
     }
-    m_projectVersion = m_reader->value(QStringLiteral("Header/projectversion"), 0).toUInt();
+    m_projectVersion = readProperty(QStringLiteral("Header"), QStringLiteral("projectversion"), QString()).toUInt();
     if (m_projectVersion > ProjectFormat::highestAcceptedVersion) {
         logTrace(3, QStringLiteral("ProjectController::openProjectFile:%s - no valid projectfile - wrong projectVersion %d"),
                  fileName, m_projectVersion);
@@ -88,8 +134,13 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
 
 bool QProjectController::writeProperty(QString section, QString key, QString value)
 {
+    if (m_newFile) {
+        m_newFile->setValue(section, key, value);
+        return true;
+    }
     if (!m_writer) {
         logTrace(3, QStringLiteral("QProjectController::writeProperty[%s]: writer object doesn't exist"), m_fileName);
+        m_writeFailed = true;
         return false;
     }
     m_writer->setValue(address(section, key), value);
@@ -98,11 +149,29 @@ bool QProjectController::writeProperty(QString section, QString key, QString val
 
 QString QProjectController::readProperty(QString section, QString key, QString defaultValue)
 {
+    if (m_plainFile) {
+        QString value;
+        switch (m_plainFile->value(section, key, value)) {
+        case IniFileReader::Lookup::Found:
+            return value;
+        case IniFileReader::Lookup::Missing:
+            return defaultValue;
+        case IniFileReader::Lookup::NeedsStore:
+            break;
+        }
+        if (!m_reader)
+            m_reader = std::make_unique<QSettings>(m_fileName, QSettings::IniFormat);
+    }
     if (!m_reader) {
         logTrace(3, QStringLiteral("QProjectController::writeProperty: file %s doesn't exist"), m_fileName);
         return QString();
     }
-    const QVariant value = m_reader->value(address(section, key));
+    return storeValue(address(section, key), defaultValue);
+}
+
+QString QProjectController::storeValue(const QString &address, const QString &defaultValue)
+{
+    const QVariant value = m_reader->value(address);
     if (!value.isValid())
         return defaultValue;
     // A hand-edited line with unquoted commas reads as a list; keep its text.
@@ -113,11 +182,30 @@ QString QProjectController::readProperty(QString section, QString key, QString d
 
 bool QProjectController::closeProjectFile()
 {
+    if (m_newFile) {
+        if (!m_newFile->save(m_fileName)) {
+            logTrace(3, QStringLiteral("QProjectController::closeProjectFile[%s] - the file could not be written"), m_fileName);
+            m_writeFailed = true;
+        }
+        m_newFile.reset();
+    }
     // The writer is synced before it goes, so the next open in the same turn
     // sees the whole file.
-    if (m_writer)
+    if (m_writer) {
         m_writer->sync();
+        if (m_writer->status() != QSettings::NoError) {
+            logTrace(3, QStringLiteral("QProjectController::closeProjectFile[%s] - the file could not be written"), m_fileName);
+            m_writeFailed = true;
+        }
+    }
     m_writer.reset();
     m_reader.reset();
+    if (m_plainFile)
+        m_lastRead.reader = std::move(m_plainFile);
     return true;
+}
+
+void QProjectController::forgetReadFile()
+{
+    m_lastRead = ReadFile();
 }

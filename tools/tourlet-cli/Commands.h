@@ -8,6 +8,8 @@
 std::vector<CliCommand> allCommands();
 
 CliCommand curveCommand();
+CliCommand projectCommand();
+CliCommand convertCommand();
 CliCommand trackCommand();
 CliCommand contentCommand();
 CliCommand encodeCommand();

@@ -1,0 +1,607 @@
+#include "project/BackupSave.h"
+#include "project/DocumentFile.h"
+#include "project/PainterPathRenderer_Controller.h"
+#include "project/ValueParsers.h"
+
+#include <QDir>
+#include <QFile>
+#include <QImage>
+#include <QRandomGenerator>
+#include <QTemporaryDir>
+#include <QTest>
+
+#include <csignal>
+#include <sys/resource.h>
+
+namespace {
+
+void writeText(const QString &file, const QByteArray &text)
+{
+    QFile f(file);
+    QVERIFY(f.open(QIODevice::WriteOnly));
+    f.write(text);
+}
+
+QByteArray readBytes(const QString &file)
+{
+    QFile f(file);
+    return f.open(QIODevice::ReadOnly) ? f.readAll() : QByteArray();
+}
+
+// A document with every field away from its default and an ordinary route of three legs.
+void fillDocument(PainterPathRenderer_Controller &doc, const QString &picture)
+{
+    ProjectFields &f = doc.fields();
+    f.sceneMode = 2;
+    f.projectTitle = QStringLiteral("Über die Alpen = 1, 2");
+    f.projectWidth = 3840;
+    f.projectHeight = 2160;
+    f.hostWidth = 800;
+    f.hostHeight = 600;
+    f.sceneWidth = 1024;
+    f.sceneHeight = 768;
+    f.pathMode = 3;
+    f.animationMode = 1;
+    f.animationFrame = 77;
+    f.animationFrameSource = QStringLiteral("frame.png");
+    f.backgroundMap = QStringLiteral("osm:layer:2");
+    f.backgroundMapColor = QStringLiteral("#123456");
+    f.ignorePauseOnKeyPoint = true;
+    f.showKeyPointsOnAnimationPosition = false;
+    f.animateKeyPoints = false;
+    f.keyPointsLocked = true;
+    f.currentZoomLevel = 1.23456789;
+    f.currentBearing = -45.5;
+    f.currentTilt = 30.0000004;
+    f.centerPosition = KeyPoint(11.123456789012345, 47.98765432109876, 0);
+    f.visibleBoundariesTL = KeyPoint(10.5, 48.5, 0);
+    f.visibleBoundariesBR = KeyPoint(12.5, 47.5, 0);
+    f.pseudoBoundariesTL = KeyPoint(-1.25, 2.5, 0);
+    f.pseudoBoundariesBR = KeyPoint(3.75, -4.5, 0);
+    f.showCompass = true;
+    f.sendExportToHost = false;
+    f.flyInEnabled = true;
+    f.flyInRotation = false;
+    f.flyInTilt = false;
+    f.linearAnimationDurations = false;
+    f.pathSettings.color = QStringLiteral("#00FF00");
+    f.pathSettings.opacity = 0.5;
+    f.pathSettings.width = 9;
+    f.pathSettings.shadowEnabled = true;
+    f.pathSettings.shadowDistance = 4.5;
+    f.pathSettings.shadowWidth = 2;
+    f.pathSettings.shadowOpacity = 0.3;
+    f.pad = 33;
+    f.fullFrameDuration = 7000;
+    f.fullFrameFadeDuration = 250;
+    f.fullFrameFullscreen = false;
+    f.fullFrameTransitionMode = 3;
+    f.altitudePresetIndex = 4;
+    f.altitudeBoardX = 10;
+    f.altitudeBoardY = 20;
+    f.altitudeBoardWidth = 300;
+    f.altitudeBoardHeight = 100;
+    f.fullFrameX = 1;
+    f.fullFrameY = 2;
+    f.fullFrameWidth = 3;
+    f.fullFrameHeight = 4;
+    f.pseudoMapCropMode = true;
+    f.pseudoMapInitialZoom = 7.5;
+    f.pseudoMapCenter = KeyPoint(5.5, 6.5, 0);
+    f.fileNameChangedByUser = true;
+
+    AnimationTiming &t = doc.timing();
+    t.flyInDuration = 9;
+    t.flyInRotation = 33.3;
+    t.flyInTilt = 44.4;
+    t.setDurationFactor(0.4);
+    t.setKeyPointAnimationDuration(4);
+
+    Path &path = doc.pathManager().activeChecked();
+    path.curveMode = CurveMode::Straight;
+    const double coords[][2] = {{11.1, 47.1}, {11.7, 47.3}, {12.2, 47.05}, {12.9, 47.6}};
+    for (int i = 0; i < 4; ++i) {
+        KeyPoint k(coords[i][0] + 1e-13, coords[i][1], 100.0 * i);
+        k.properties.title = QStringLiteral("Stop %1").arg(i);
+        k.properties.durationToNextKP = 1000 * (i + 1);
+        k.properties.durationPause = 250 * i;
+        k.properties.font.family = QStringLiteral("Serif %1").arg(i);
+        path.addKeyPoint(k, i == 3);
+    }
+    path.pathSegments[1].pilot.source = QStringLiteral("/avatars/bike.png");
+    path.pathSegments[1].pilot.width = 80.25;
+    path.pathSegments[1].pilot.flags = PilotProperties::isAnimated | PilotProperties::symmetric;
+
+    MediaPoint onKey(path.keyPoints[2].x, path.keyPoints[2].y, 0);
+    onKey.properties.imageSources.append(MediaFile{picture, 0});
+    path.addMediaPoint(onKey, path.keyPoints[2].id, false);
+
+    doc.photoPool().add(picture, 32, 16);
+    doc.photoPool().fullFrameCropping = true;
+    doc.altitudePreset().radius = 17;
+    doc.altitudePreset().peakColor = QStringLiteral("#ABCDEF");
+}
+
+double six(double v)
+{
+    return std::round(v * 1e6) / 1e6;
+}
+
+} // namespace
+
+class TestDocument : public QObject
+{
+    Q_OBJECT
+
+private:
+    QTemporaryDir m_dir;
+    QString path(const QString &name) const { return m_dir.filePath(name); }
+    QString projectHeader(int version = 2) const
+    {
+        return QStringLiteral("[Header]\nprojecttype=ZKGEO\nprojectversion=%1\n").arg(version);
+    }
+
+private slots:
+    void initTestCase()
+    {
+        // Silence the expected "missing key" lines.
+        qInstallMessageHandler([](QtMsgType, const QMessageLogContext &, const QString &) {});
+    }
+
+    void newDocumentDefaults()
+    {
+        PainterPathRenderer_Controller doc;
+        doc.fields().projectTitle = QStringLiteral("x");
+        doc.fields().hostName = QStringLiteral("Host");
+        doc.timing().setDurationFactor(0.5);
+        doc.setMaxAnimationDuration(3);
+        doc.photoPool().add(QStringLiteral("/a.jpg"), 1, 1);
+        doc.pathManager().activeChecked().addKeyPoint(1, 2, 0, QString(), true);
+        doc.newProject();
+
+        const ProjectFields &f = doc.fields();
+        QVERIFY(f.projectTitle.isEmpty());
+        QCOMPARE(f.hostName, QStringLiteral("Host"));
+        QCOMPARE(f.versionText, QStringLiteral("0.0.0.5"));
+        QCOMPARE(f.projectWidth, 1920);
+        QCOMPARE(f.centerPosition.latitude, 51.0541733);
+        QCOMPARE(f.centerPosition.longitude, 13.7164023);
+        QCOMPARE(f.pseudoMapCenter.longitude, 13.7164023);
+        QCOMPARE(f.visibleBoundariesBR.longitude, 15.015715549);
+        QCOMPARE(f.backgroundMapColor, QStringLiteral("#70B5D5"));
+        QCOMPARE(f.fullFrameWidth, -1);
+        QCOMPARE(doc.timing().durationFactor, -1.0);
+        QCOMPARE(doc.timing().maxDurationIndex, 3u);
+        QVERIFY(doc.photoPool().photos.empty());
+        QVERIFY(doc.pathManager().active()->keyPoints.empty());
+        QCOMPARE(doc.altitudePreset().boardColor, QStringLiteral("#0D0D0D"));
+    }
+
+    void saveThenLoadReproducesTheDocument()
+    {
+        QImage image(32, 16, QImage::Format_RGB32);
+        image.fill(Qt::red);
+        const QString picture = path(QStringLiteral("photo.png"));
+        QVERIFY(image.save(picture));
+
+        PainterPathRenderer_Controller doc;
+        fillDocument(doc, picture);
+        const QString file = path(QStringLiteral("round trip.zkgeo"));
+        QVERIFY(saveDocumentFile(doc, file));
+        QVERIFY(!QFile::exists(backupFileName(file)));
+
+        PainterPathRenderer_Controller back;
+        const DocumentOpenResult result = openDocumentFile(back, file);
+        QCOMPARE(int(result.status), int(DocumentOpenResult::Status::Project));
+
+        const ProjectFields &a = doc.fields();
+        const ProjectFields &b = back.fields();
+        QCOMPARE(b.sceneMode, a.sceneMode);
+        QCOMPARE(b.projectTitle, a.projectTitle);
+        QCOMPARE(b.projectWidth, a.projectWidth);
+        QCOMPARE(b.projectHeight, a.projectHeight);
+        QCOMPARE(b.hostWidth, a.hostWidth);
+        QCOMPARE(b.hostHeight, a.hostHeight);
+        QCOMPARE(b.sceneWidth, a.sceneWidth);
+        QCOMPARE(b.sceneHeight, a.sceneHeight);
+        QCOMPARE(b.pathMode, a.pathMode);
+        QCOMPARE(b.animationMode, a.animationMode);
+        QCOMPARE(b.animationFrame, 0); // written as "animationFrame", read as "m_animationFrame"
+        QCOMPARE(b.animationFrameSource, a.animationFrameSource);
+        QCOMPARE(b.backgroundMap, a.backgroundMap);
+        QCOMPARE(b.backgroundMapColor, a.backgroundMapColor);
+        QCOMPARE(b.ignorePauseOnKeyPoint, true);
+        QCOMPARE(b.showKeyPointsOnAnimationPosition, false);
+        QCOMPARE(b.animateKeyPoints, false);
+        QCOMPARE(b.keyPointsLocked, false); // a loaded project is always unlocked
+        QCOMPARE(b.currentZoomLevel, 1.234568);
+        QCOMPARE(b.currentBearing, -45.5);
+        QCOMPARE(b.currentTilt, 30.0);
+        QCOMPARE(b.centerPosition.longitude, a.centerPosition.longitude); // coordinates come back exactly
+        QCOMPARE(b.centerPosition.y, a.centerPosition.y);
+        QCOMPARE(b.visibleBoundariesTL.latitude, 48.5);
+        QCOMPARE(b.visibleBoundariesBR.longitude, 12.5);
+        QCOMPARE(b.pseudoBoundariesTL.x, -1.25);
+        QCOMPARE(b.pseudoBoundariesBR.latitude, -4.5);
+        QCOMPARE(b.showCompass, true);
+        QCOMPARE(b.sendExportToHost, false);
+        QCOMPARE(b.flyInEnabled, true);
+        QCOMPARE(b.flyInRotation, false);
+        QCOMPARE(b.flyInTilt, false);
+        QCOMPARE(b.linearAnimationDurations, false);
+        QCOMPARE(b.pathSettings.toMap(), a.pathSettings.toMap());
+        QCOMPARE(b.pad, 33);
+        QCOMPARE(b.fullFrameDuration, 7000);
+        QCOMPARE(b.fullFrameFadeDuration, 250);
+        QCOMPARE(b.fullFrameFullscreen, false);
+        QCOMPARE(b.fullFrameTransitionMode, 3);
+        QCOMPARE(b.altitudePresetIndex, 4);
+        QCOMPARE(b.altitudeBoardX, 10);
+        QCOMPARE(b.altitudeBoardHeight, 100);
+        QCOMPARE(b.fullFrameX, 1);
+        QCOMPARE(b.fullFrameHeight, 4);
+        QCOMPARE(b.pseudoMapCropMode, true);
+        QCOMPARE(b.pseudoMapInitialZoom, 7.5);
+        QCOMPARE(b.pseudoMapCenter.longitude, 5.5);
+        QCOMPARE(b.fileNameChangedByUser, true);
+
+        const AnimationTiming &t = back.timing();
+        QCOMPARE(t.flyInDuration, 9);
+        QCOMPARE(t.flyInRotation, 33.3);
+        QCOMPARE(t.flyInTilt, 44.4);
+        QCOMPARE(t.durationFactor, 0.4);
+        QCOMPARE(t.durationText, AnimationTiming::formatDuration(int32_t(std::trunc(t.totalFrames * 0.4))));
+        QCOMPARE(t.keyPointAnimationDuration, 4);
+        QCOMPARE(t.keyPointAnimationFrames, 60);
+
+        const Path &p = doc.pathManager().activeChecked();
+        const Path &q = back.pathManager().activeChecked();
+        QCOMPARE(q.pathType, PathType::Ordinary);
+        QCOMPARE(q.curveMode, CurveMode::Straight);
+        QCOMPARE(q.keyPoints.size(), p.keyPoints.size());
+        for (size_t i = 0; i < p.keyPoints.size(); ++i) {
+            QCOMPARE(q.keyPoints[i].x, p.keyPoints[i].x);
+            QCOMPARE(q.keyPoints[i].z, p.keyPoints[i].z);
+            QCOMPARE(q.keyPoints[i].properties.title, p.keyPoints[i].properties.title);
+            QCOMPARE(q.keyPoints[i].properties.durationToNextKP, p.keyPoints[i].properties.durationToNextKP);
+            QCOMPARE(q.keyPoints[i].properties.durationPause, p.keyPoints[i].properties.durationPause);
+            QCOMPARE(q.keyPoints[i].properties.font.family, p.keyPoints[i].properties.font.family);
+            QCOMPARE(q.pathSegments[i].keyPointId, q.keyPoints[i].id);
+            QCOMPARE(q.keyPoints[i].correspondingPathSegmentId, q.pathSegments[i].id);
+        }
+        QCOMPARE(q.pathSegments.size(), size_t(4));
+        QCOMPARE(q.pathSegments[1].pilot.source, QStringLiteral("/avatars/bike.png"));
+        QCOMPARE(q.pathSegments[1].pilot.width, 80.25);
+        QCOMPARE(q.pathSegments[1].pilot.flags, uint32_t(PilotProperties::isAnimated | PilotProperties::symmetric));
+        QCOMPARE(q.pathSegments[0].pilot.flags, uint32_t(PilotProperties::rotation));
+        QCOMPARE(q.curvePoints.size(), p.curvePoints.size()); // rebuilt after the load
+        QCOMPARE(q.mediaPoints.size(), size_t(1));
+        QCOMPARE(q.mediaPoints[0].properties.imageSources.size(), 1);
+        QCOMPARE(q.mediaPoints[0].longitude, p.keyPoints[2].x);
+        QCOMPARE(back.naturalFrames(), 30 + 60 + 90);
+
+        QCOMPARE(back.photoPool().photos.size(), size_t(1));
+        QCOMPARE(back.photoPool().photos[0].sizeW, 32);
+        QCOMPARE(back.photoPool().photos[0].sizeH, 16);
+        QVERIFY(back.photoPool().fullFrameCropping);
+        QVERIFY(!back.photoPool().fullFrameBorderEffect);
+        QCOMPARE(back.altitudePreset().radius, 17);
+        QCOMPARE(back.altitudePreset().peakColor, QStringLiteral("#ABCDEF"));
+        QCOMPARE(back.altitudePreset().version, QStringLiteral("0.0.0.5"));
+
+        // A second save of the loaded document gives the same bytes, apart from the
+        // fields that do not come back by design.
+        back.fields().animationFrame = a.animationFrame;
+        back.fields().keyPointsLocked = a.keyPointsLocked;
+        back.photoPool().photos[0].id = doc.photoPool().photos[0].id;
+        const QString again = path(QStringLiteral("again.zkgeo"));
+        QVERIFY(saveDocumentFile(back, again));
+        QCOMPARE(readBytes(again), readBytes(file));
+    }
+
+    void trackPathKeepsItsCurve()
+    {
+        PainterPathRenderer_Controller doc;
+        Path &path = doc.pathManager().activeChecked();
+        path.pathType = PathType::GPX;
+        path.curveMode = CurveMode::Straight;
+        for (int i = 0; i < 50; ++i)
+            path.addCurvePoint(8.0 + i * 0.001234567891234, 50.0 + std::sin(i) * 0.01, 100 + i);
+        KeyPoint first(path.curvePoints.front().x, path.curvePoints.front().y, 100);
+        KeyPoint last(path.curvePoints.back().x, path.curvePoints.back().y, 149);
+        path.addKeyPoint(first, false);
+        path.addKeyPoint(last, false);
+        path.curvePoints.front().correspondingKeyPoint = path.keyPoints[0].id;
+        path.curvePoints.back().correspondingKeyPoint = path.keyPoints[1].id;
+        path.pathSegments[0].curvePoints = path.curvePoints;
+        MediaPoint media(path.curvePoints[10].x, path.curvePoints[10].y, 0);
+        path.addMediaPoint(media, 0, false);
+        QCOMPARE(path.curvePoints[10].correspondingMediaPoint, path.mediaPoints[0].id);
+
+        const QString file = path_(QStringLiteral("track.zkgeo"));
+        QVERIFY(saveDocumentFile(doc, file));
+        PainterPathRenderer_Controller back;
+        QCOMPARE(int(openDocumentFile(back, file).status), int(DocumentOpenResult::Status::Project));
+        const Path &q = back.pathManager().activeChecked();
+        QCOMPARE(q.pathType, PathType::GPX);
+        QVERIFY(q.isFixedTrack());
+        QCOMPARE(q.curvePoints.size(), size_t(50));
+        for (size_t i = 0; i < 50; ++i) {
+            QCOMPARE(q.curvePoints[i].x, path.curvePoints[i].x);
+            QCOMPARE(q.curvePoints[i].y, path.curvePoints[i].y);
+            QCOMPARE(q.curvePoints[i].z, path.curvePoints[i].z);
+        }
+        // References come back as ids of the loaded points.
+        QCOMPARE(q.curvePoints.front().correspondingKeyPoint, q.keyPoints[0].id);
+        QCOMPARE(q.curvePoints.back().correspondingKeyPoint, q.keyPoints[1].id);
+        QCOMPARE(q.curvePoints[5].correspondingKeyPoint, 0u);
+        QCOMPARE(q.curvePoints[10].correspondingMediaPoint, q.mediaPoints[0].id);
+        QCOMPARE(q.pathSegments[0].curvePoints.size(), size_t(50));
+        QCOMPARE(q.pathSegments[0].curvePoints.back().correspondingKeyPoint, q.keyPoints[1].id);
+
+        // An ordinary path stores no curve.
+        PainterPathRenderer_Controller plain;
+        plain.pathManager().activeChecked().addKeyPoint(1, 2, 0, QString(), false);
+        plain.pathManager().activeChecked().addKeyPoint(3, 4, 0, QString(), true);
+        QVERIFY(!plain.pathManager().activeChecked().curvePoints.empty());
+        const QString plainFile = path_(QStringLiteral("plain.zkgeo"));
+        QVERIFY(saveDocumentFile(plain, plainFile));
+        QVERIFY(!readBytes(plainFile).contains("[curvepoints]"));
+        QVERIFY(!readBytes(plainFile).contains("[curvepoint0]"));
+        QVERIFY(readBytes(file).contains("[curvepoint49]"));
+    }
+
+    void handWrittenOldProjects()
+    {
+        // Version 1: one font and size for all key points, one avatar for all segments,
+        // no fly-in keys and the old route duration.
+        const QString v1 = path(QStringLiteral("v1.zkgeo"));
+        writeText(v1, (projectHeader(1) + QStringLiteral(
+            "[animator]\ncurvemode=1\npathtype=1\n"
+            "[kp_font]\nfamily=Courier\ncolor=#FF00FF\npointSize=30.5\nhasShadow=1\nhasFrame=0\n"
+            "[keypoints]\nelements=3\nsize=2.5\n"
+            "[keypoint0]\nx=1\ny=2\nkppDurationToNextKP=1000\n"
+            "[keypoint1]\nx=3\ny=4\nkppDurationToNextKP=2000\nfamily=Own\n"
+            "[keypoint2]\nx=5\ny=6\n"
+            "[pilot]\npilot_source=/old/car.png\npilot_width=55.5\npilot_rotation=0\npilot_isAnimated=1\n"
+            "[route]\nanimationDuration=50\n")).toUtf8());
+        PainterPathRenderer_Controller doc;
+        QCOMPARE(int(openDocumentFile(doc, v1).status), int(DocumentOpenResult::Status::Project));
+        const Path &p = doc.pathManager().activeChecked();
+        QCOMPARE(p.keyPoints.size(), size_t(3));
+        QCOMPARE(p.keyPoints[0].properties.font.family, QStringLiteral("Courier"));
+        QCOMPARE(p.keyPoints[0].properties.font.color, QStringLiteral("#FF00FF"));
+        QCOMPARE(p.keyPoints[2].properties.font.pointSize, 30.5);
+        QCOMPARE(p.keyPoints[2].properties.font.hasFrame, false);
+        QCOMPARE(p.keyPoints[2].properties.size, 2.5);
+        QCOMPARE(p.keyPoints[1].properties.font.family, QStringLiteral("Own"));
+        for (const PathSegment &s : p.pathSegments) {
+            QCOMPARE(s.pilot.source, QStringLiteral("/old/car.png"));
+            QCOMPARE(s.pilot.width, 55.5);
+            QCOMPARE(s.pilot.flags, uint32_t(PilotProperties::isAnimated));
+        }
+        QCOMPARE(doc.fields().flyInEnabled, false);
+        QCOMPARE(doc.fields().flyInRotation, true);
+        QCOMPARE(doc.timing().flyInDuration, 5);
+        QCOMPARE(doc.timing().flyInRotation, 60.0);
+        // 30 + 60 natural frames; the old 50 % becomes (0.5 * 9 + 1) of the base 1/15.
+        QCOMPARE(doc.naturalFrames(), 90);
+        QCOMPARE(doc.timing().durationFactor, 5.5 / 15.0);
+        QCOMPARE(doc.timing().totalFrames, 3600);
+
+        // Version 2 with fewer segments than key points, fly-in flags without values,
+        // and neither route key: the segments stay as made, the factor as reset.
+        const QString v2 = path(QStringLiteral("v2.zkgeo"));
+        writeText(v2, (projectHeader() + QStringLiteral(
+            "[animator]\ncurvemode=2\npathtype=1\n"
+            "[flyIn]\nenabled=1\nenableRotation=0\nenableTilt=1\n"
+            "[keypoints]\nelements=3\n[keypoint0]\nx=1\ny=2\n[keypoint1]\nx=3\ny=4\n[keypoint2]\nx=5\ny=6\n"
+            "[pathSegments]\nelements=2\n"
+            "[pathsegment0]\npilot_source=/seg0.png\n[pathsegment1]\npilot_source=/seg1.png\n"
+            "[mediapoints]\nelements=2\n"
+            "[mediapoint0]\nx=3\ny=4\nlongitude=3\nlatitude=4\n"
+            "[mediapoint1]\nx=9\ny=9\nlongitude=9\nlatitude=9\n")).toUtf8());
+        QCOMPARE(int(openDocumentFile(doc, v2).status), int(DocumentOpenResult::Status::Project));
+        const Path &q = doc.pathManager().activeChecked();
+        QCOMPARE(q.keyPoints.size(), size_t(3));
+        QCOMPARE(q.pathSegments.size(), size_t(3));
+        for (const PathSegment &s : q.pathSegments)
+            QVERIFY(s.pilot.source.isEmpty());
+        QCOMPARE(doc.fields().flyInEnabled, true);
+        QCOMPARE(doc.fields().flyInRotation, false);
+        QCOMPARE(doc.timing().flyInTilt, 54.0);
+        QCOMPARE(doc.timing().durationFactor, -1.0);
+        QCOMPARE(q.mediaPoints.size(), size_t(2));
+    }
+
+    void themeInTheSameWritingGivesTheSameBytes()
+    {
+        QImage image(8, 8, QImage::Format_RGB32);
+        image.fill(Qt::blue);
+        const QString picture = path(QStringLiteral("theme.png"));
+        QVERIFY(image.save(picture));
+        PainterPathRenderer_Controller doc;
+        fillDocument(doc, picture);
+        doc.altitudePreset().background = QStringLiteral("C:\\boards\\one, two.png");
+
+        const QString twoSteps = path(QStringLiteral("two steps.zkgeo"));
+        QVERIFY(doc.SaveProject(twoSteps));
+        QVERIFY(doc.saveAltitudePreset(twoSteps, altitudePresetPrefix(), doc.altitudePreset()));
+        const QString oneStep = path(QStringLiteral("one step.zkgeo"));
+        QVERIFY(doc.SaveProjectWithTheme(oneStep));
+        QVERIFY(readBytes(oneStep).contains("[altprs.graph]"));
+        QCOMPARE(readBytes(oneStep), readBytes(twoSteps));
+    }
+
+    void keyOrderDoesNotMatter()
+    {
+        QImage image(8, 8, QImage::Format_RGB32);
+        image.fill(Qt::blue);
+        const QString picture = path(QStringLiteral("order.png"));
+        QVERIFY(image.save(picture));
+        PainterPathRenderer_Controller doc;
+        fillDocument(doc, picture);
+        const QString file = path(QStringLiteral("ordered.zkgeo"));
+        QVERIFY(saveDocumentFile(doc, file));
+
+        // Rewrite the file by hand: sections and the lines inside them shuffled.
+        QList<QStringList> sections;
+        for (const QString &line : QString::fromUtf8(readBytes(file)).split(QLatin1Char('\n'), Qt::SkipEmptyParts)) {
+            if (line.startsWith(QLatin1Char('[')))
+                sections.append(QStringList{line});
+            else
+                sections.last().append(line);
+        }
+        QRandomGenerator random(20240601);
+        QByteArray shuffled;
+        while (!sections.isEmpty()) {
+            QStringList section = sections.takeAt(int(random.bounded(sections.size())));
+            const QString heading = section.takeFirst();
+            shuffled += heading.toUtf8() + '\n';
+            while (!section.isEmpty())
+                shuffled += section.takeAt(int(random.bounded(section.size()))).toUtf8() + '\n';
+        }
+        const QString mixed = path(QStringLiteral("mixed.zkgeo"));
+        writeText(mixed, shuffled);
+        QVERIFY(readBytes(mixed) != readBytes(file));
+
+        PainterPathRenderer_Controller fromOrdered, fromMixed;
+        QVERIFY(openDocumentFile(fromOrdered, file).ok());
+        QVERIFY(openDocumentFile(fromMixed, mixed).ok());
+        const QString a = path(QStringLiteral("a.zkgeo")), b = path(QStringLiteral("b.zkgeo"));
+        fromMixed.photoPool().photos[0].id = fromOrdered.photoPool().photos[0].id;
+        QVERIFY(saveDocumentFile(fromOrdered, a));
+        QVERIFY(saveDocumentFile(fromMixed, b));
+        QCOMPARE(readBytes(b), readBytes(a));
+    }
+
+    void damagedAndForeignFiles()
+    {
+        PainterPathRenderer_Controller doc;
+        const QString damaged = path(QStringLiteral("damaged.zkgeo"));
+        writeText(damaged, (projectHeader() + QStringLiteral(
+            "[animator]\nprojectTitle=Half read\n"
+            "[keypoints]\nelements=1\n[keypoint0]\nx=1\ny=north\n")).toUtf8());
+        doc.pathManager().activeChecked().addKeyPoint(1, 2, 0, QString(), true);
+        DocumentOpenResult result = openDocumentFile(doc, damaged);
+        QCOMPARE(int(result.status), int(DocumentOpenResult::Status::DamagedProject));
+        QVERIFY(!result.reason.isEmpty());
+        QVERIFY(doc.fields().projectTitle.isEmpty()); // back to a new project
+        QVERIFY(doc.pathManager().activeChecked().keyPoints.empty());
+        QVERIFY(doc.projectController().isIdle());
+
+        writeText(damaged, (projectHeader() + QStringLiteral("[animator]\nprojectWidth=99999999999\n")).toUtf8());
+        QCOMPARE(int(openDocumentFile(doc, damaged).status), int(DocumentOpenResult::Status::DamagedProject));
+        QCOMPARE(doc.fields().projectWidth, 1920);
+
+        // A path type that is no number is taken as 0, not as damage.
+        writeText(damaged, (projectHeader() + QStringLiteral("[animator]\npathtype=gpx\nprojectTitle=t\n")).toUtf8());
+        QVERIFY(openDocumentFile(doc, damaged).ok());
+        QCOMPARE(doc.fields().projectTitle, QStringLiteral("t"));
+
+        const QString garbage = path(QStringLiteral("garbage.zkgeo"));
+        QByteArray noise(4096, '\0');
+        QRandomGenerator random(7);
+        for (char &c : noise)
+            c = char(random.bounded(256));
+        writeText(garbage, noise);
+        result = openDocumentFile(doc, garbage);
+        QCOMPARE(int(result.status), int(DocumentOpenResult::Status::Unreadable));
+        QVERIFY(!result.reason.isEmpty());
+        QCOMPARE(int(openDocumentFile(doc, path(QStringLiteral("absent.zkgeo"))).status),
+                 int(DocumentOpenResult::Status::Unreadable));
+        QVERIFY(doc.projectController().isIdle());
+
+        // Every cut of a real project loads or fails cleanly, never crashes.
+        QImage image(8, 8, QImage::Format_RGB32);
+        image.fill(Qt::blue);
+        const QString picture = path(QStringLiteral("cut.png"));
+        QVERIFY(image.save(picture));
+        PainterPathRenderer_Controller full;
+        fillDocument(full, picture);
+        const QString whole = path(QStringLiteral("whole.zkgeo"));
+        QVERIFY(saveDocumentFile(full, whole));
+        const QByteArray bytes = readBytes(whole);
+        int loaded = 0;
+        for (int cut = 0; cut < bytes.size(); cut += 97) {
+            const QString truncated = path(QStringLiteral("cut.zkgeo"));
+            writeText(truncated, bytes.left(cut));
+            const DocumentOpenResult r = openDocumentFile(doc, truncated);
+            loaded += r.ok() ? 1 : 0;
+            QVERIFY(doc.projectController().isIdle());
+        }
+        QVERIFY(loaded > 0);
+    }
+
+    void previousFileSurvivesAFailedSave()
+    {
+        QImage image(8, 8, QImage::Format_RGB32);
+        image.fill(Qt::blue);
+        const QString picture = path(QStringLiteral("bak.png"));
+        QVERIFY(image.save(picture));
+        PainterPathRenderer_Controller doc;
+        fillDocument(doc, picture);
+        const QString file = path(QStringLiteral("precious.zkgeo"));
+        QVERIFY(saveDocumentFile(doc, file));
+        const QByteArray before = readBytes(file);
+        const QString backup = backupFileName(file);
+
+        // A file system that fills up in the middle of the write.
+        Path &track = doc.pathManager().activeChecked();
+        track.pathType = PathType::GPX;
+        for (int i = 0; i < 20000; ++i)
+            track.addCurvePoint(i * 1e-4, 45.0, 0);
+        std::signal(SIGXFSZ, SIG_IGN);
+        rlimit old{};
+        QCOMPARE(getrlimit(RLIMIT_FSIZE, &old), 0);
+        rlimit small = old;
+        small.rlim_cur = rlim_t(before.size()) + 4096;
+        QCOMPARE(setrlimit(RLIMIT_FSIZE, &small), 0);
+        const bool saved = saveDocumentFile(doc, file);
+        QCOMPARE(setrlimit(RLIMIT_FSIZE, &old), 0);
+        QVERIFY(!saved);
+        QVERIFY(QFile::exists(backup));
+        QCOMPARE(readBytes(backup), before);
+        QVERIFY(doc.projectController().isIdle());
+
+        // The next save that works replaces the file and drops the copy; a backup
+        // already there is the last complete version and is not overwritten meanwhile.
+        QVERIFY(!saveWithBackup(file, [] { return false; }));
+        QCOMPARE(readBytes(backup), before);
+        QVERIFY(saveDocumentFile(doc, file));
+        QVERIFY(!QFile::exists(backup));
+        QVERIFY(readBytes(file).size() > before.size());
+
+        // A write that fails by itself keeps the fresh copy.
+        const QByteArray good = readBytes(file);
+        QVERIFY(!saveWithBackup(file, [&] {
+            writeText(file, "half");
+            return false;
+        }));
+        QCOMPARE(readBytes(backup), good);
+        QFile::remove(backup);
+
+        // A place where no file can be made: the container goes on as documented,
+        // the save as a whole reports the failure.
+        const QString nowhere = path(QStringLiteral("no such folder/x.zkgeo"));
+        QVERIFY(doc.SaveProject(nowhere));
+        QVERIFY(doc.projectController().lastWriteFailed());
+        QVERIFY(!saveDocumentFile(doc, nowhere));
+        QVERIFY(!QFile::exists(nowhere));
+
+        // No copy can be made: nothing is written.
+        const QString intoFolder = path(QStringLiteral("folder.zkgeo"));
+        writeText(intoFolder, "old");
+        QVERIFY(QDir().mkpath(backupFileName(intoFolder) + QStringLiteral("/x")));
+        bool called = false;
+        QVERIFY(!saveWithBackup(intoFolder, [&] { return called = true; }));
+        QVERIFY(!called);
+        QCOMPARE(readBytes(intoFolder), QByteArray("old"));
+    }
+
+private:
+    QString path_(const QString &name) const { return path(name); }
+};
+
+QTEST_GUILESS_MAIN(TestDocument)
+#include "tst_document.moc"
