@@ -2,6 +2,9 @@
 #include "animation/FlyInCamera.h"
 #include "animation/PlainAnimationSource.h"
 #include "animation/VisibleRegionProvider.h"
+#include "path/PathManager.h"
+#include "project/DocumentAnimationSource.h"
+#include "project/PainterPathRenderer_Controller.h"
 
 #include <QTest>
 
@@ -219,6 +222,65 @@ private slots:
         FlyInCamera bareCamera(bare);
         QCOMPARE(bareCamera.prepareFlyIn(), 9.3);
         QCOMPARE(bare.camera.zoom, 9.3);
+    }
+
+    void documentCamera()
+    {
+        // The document's own fields carry the camera, the stored view boundary and
+        // the switches through a playback.
+        PainterPathRenderer_Controller document;
+        document.newProject();
+        Path &path = document.pathManager().activeChecked();
+        path.addKeyPoint(10.0, 45.0, 0.0, QStringLiteral("A"), false);
+        path.addKeyPoint(10.1, 45.05, 0.0, QStringLiteral("B"), true);
+        ProjectFields &f = document.fields();
+        f.currentZoomLevel = 12.25;
+        f.currentBearing = 5.0;
+        f.currentTilt = 0.0;
+        f.visibleBoundariesTL.setLongitude(9.0, true);
+        f.visibleBoundariesTL.setLatitude(46.0, true);
+        f.visibleBoundariesBR.setLongitude(11.0, true);
+        f.visibleBoundariesBR.setLatitude(44.0, true);
+        f.flyInEnabled = true;
+        f.flyInRotation = false;
+        f.fullFrameFadeDuration = 1000;
+        f.linearAnimationDurations = false;
+
+        DocumentAnimationSource source(document);
+        QCOMPARE(source.visibleBoundaries().width(), 2.0);
+        QCOMPARE(source.visibleBoundaries().height(), 2.0);
+        QVERIFY(!source.flyInSwitches().enableRotation);
+        QVERIFY(source.flyInSwitches().enableTilt);
+        QCOMPARE(source.fullFrameTiming().fadeDuration, 1000);
+        QVERIFY(!source.linearAnimationDurations());
+
+        FlyInCamera camera(source);
+        QCOMPARE(camera.prepareFlyIn(), 12.25);
+        // 0.1 x 0.05 degrees in a 2 x 2 view: doubled until twice the height no
+        // longer fits (five times, z 7), then once more out.
+        QCOMPARE(f.currentZoomLevel, 6.0);
+        AnimationEventList list(source);
+        QVERIFY(list.build(source.linearAnimationDurations(), true, 12.25));
+        QCOMPARE(list.events()[1].zoom, 6.0);
+        QCOMPARE(list.events()[150].zoom, 12.25);
+        QCOMPARE(list.events()[1].bearing, 5.0);
+        QCOMPARE(source.animationEventCount(), list.count());
+
+        const double centreX = f.centerPosition.x;
+        f.centerPosition.setLongitude(0.5, false);
+        f.currentBearing = 90.0;
+        f.currentTilt = 30.0;
+        camera.restoreView();
+        QCOMPARE(f.currentZoomLevel, 12.25);
+        QCOMPARE(f.currentBearing, 5.0);
+        QCOMPARE(f.currentTilt, 0.0);
+        QCOMPARE(f.centerPosition.longitude, FlyInCamera::savedView().centre.longitude);
+        QCOMPARE(f.centerPosition.x, centreX);
+
+        // A picture of the photo pool lends its size to the photograph's events.
+        document.photoPool().add(QStringLiteral("/nowhere/p.jpg"), 800, 600);
+        QCOMPARE(source.photoPoolSize(QStringLiteral("/nowhere/p.jpg")), QSize(800, 600));
+        QVERIFY(!source.photoPoolSize(QStringLiteral("/nowhere/q.jpg")).isValid());
     }
 };
 

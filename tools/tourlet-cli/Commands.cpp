@@ -9,5 +9,6 @@ std::vector<CliCommand> allCommands()
     commands.push_back(trackCommand());
     commands.push_back(contentCommand());
     commands.push_back(encodeCommand());
+    commands.push_back(eventsCommand());
     return commands;
 }

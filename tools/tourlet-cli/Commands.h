@@ -13,3 +13,4 @@ CliCommand convertCommand();
 CliCommand trackCommand();
 CliCommand contentCommand();
 CliCommand encodeCommand();
+CliCommand eventsCommand();
