@@ -208,8 +208,9 @@ void ProjectLoader::readKeyPoints()
     QVector<KeyPoint> keyPoints;
     loadKeyPoints(m_store, m_store.projectVersion(), keyPoints);
     path->keyPoints.reserve(path->keyPoints.size() + size_t(keyPoints.size()));
-    for (const KeyPoint &point : qAsConst(keyPoints))
-        path->addKeyPoint(point, false);
+    // Only the last key point asks for the curve, so that media points find their samples.
+    for (int i = 0; i < keyPoints.size(); ++i)
+        path->addKeyPoint(keyPoints[i], i + 1 == keyPoints.size());
 }
 
 void ProjectLoader::readSegments()

@@ -351,6 +351,39 @@ private slots:
         QVERIFY(readBytes(file).contains("[curvepoint49]"));
     }
 
+    void photosKeepTheirPlacesOnAnOrdinaryRoute()
+    {
+        PainterPathRenderer_Controller doc;
+        Path &path = doc.pathManager().activeChecked();
+        path.curveMode = CurveMode::Smooth;
+        const double coords[][2] = {{2.35, 48.85}, {4.83, 45.76}, {5.37, 43.30}};
+        for (int i = 0; i < 3; ++i)
+            path.addKeyPoint(coords[i][0], coords[i][1], 0, QString(), i == 2);
+        MediaPoint onKey(path.keyPoints[1].x, path.keyPoints[1].y, 0);
+        path.addMediaPoint(onKey, path.keyPoints[1].id, false);
+        MediaPoint midLeg(path.curvePoints[100].x, path.curvePoints[100].y, 0);
+        path.addMediaPoint(midLeg, 0, false);
+        auto placeOf = [](const Path &p, size_t media) {
+            for (size_t i = 0; i < p.curvePoints.size(); ++i)
+                if (p.curvePoints[i].correspondingMediaPoint == p.mediaPoints[media].id)
+                    return int(i);
+            return -1;
+        };
+        const int keyPlace = placeOf(path, 0);
+        QVERIFY(keyPlace > 100);
+        QCOMPARE(placeOf(path, 1), 100);
+
+        const QString file = path_(QStringLiteral("photos.zkgeo"));
+        QVERIFY(saveDocumentFile(doc, file));
+        PainterPathRenderer_Controller back;
+        QCOMPARE(int(openDocumentFile(back, file).status), int(DocumentOpenResult::Status::Project));
+        const Path &q = back.pathManager().activeChecked();
+        QCOMPARE(q.curvePoints.size(), path.curvePoints.size());
+        QCOMPARE(q.mediaPoints.size(), size_t(2));
+        QCOMPARE(placeOf(q, 0), keyPlace);
+        QCOMPARE(placeOf(q, 1), 100);
+    }
+
     void handWrittenOldProjects()
     {
         // Version 1: one font and size for all key points, one avatar for all segments,
