@@ -23,7 +23,7 @@ bool writeTrack(const QString &fileName)
         return false;
     QByteArray chunk;
     chunk += "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
-             "<gpx xmlns=\"http://www.topografix.com/GPX/1/1\" creator=\"bench\" version=\"1.1\"\n"
+             "<gpx xmlns=\"http://example.org/GPX/1/1\" creator=\"bench\" version=\"1.1\"\n"
              " xmlns:xsi=\"http://www.w3.org/2001/XMLSchema-instance\">\n"
              " <metadata><time>2024-05-01T06:00:00Z</time></metadata>\n"
              " <trk><name>Long day</name><trkseg>\n";

@@ -60,7 +60,7 @@ bool KmzArchive::isSafeEntryName(const QString &name)
 {
     if (name.startsWith(QLatin1Char('/')) || name.startsWith(QLatin1Char('\\')) || QDir::isAbsolutePath(name))
         return false;
-    // Archives made on Windows may use backslashes as separators.
+    // Archives made by some tools use backslashes as separators.
     const QVector<QStringRef> parts = name.splitRef(QRegExp(QStringLiteral("[/\\\\]")));
     for (const QStringRef &part : parts) {
         if (part == QLatin1String(".."))

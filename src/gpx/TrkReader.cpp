@@ -20,8 +20,8 @@ QString TrkReader::decode(const QByteArray &bytes)
     const QString text = QTextCodec::codecForMib(106)->toUnicode(bytes.constData(), bytes.size(), &state);
     if (state.invalidChars == 0 && state.remainingChars == 0)
         return text;
-    if (QTextCodec *windows = QTextCodec::codecForName("windows-1252"))
-        return windows->toUnicode(bytes);
+    if (QTextCodec *singleByte = QTextCodec::codecForName("windows-1252"))
+        return singleByte->toUnicode(bytes);
     return QString::fromLatin1(bytes);
 }
 

@@ -16,7 +16,7 @@ public:
     bool read(QIODevice &device);
 
     // The text of a file: a byte-order mark decides when there is one, then UTF-8 when
-    // the bytes are valid UTF-8, else the Windows code page these files are written in.
+    // the bytes are valid UTF-8, else the single-byte code page 1252 these files are written in.
     static QString decode(const QByteArray &bytes);
 
 private:

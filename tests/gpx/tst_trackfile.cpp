@@ -157,10 +157,10 @@ private slots:
         // namespaces, a byte-order mark and CRLF line ends.
         const QByteArray device =
             "\xEF\xBB\xBF<?xml version=\"1.0\" encoding=\"UTF-8\" standalone=\"no\" ?>\r\n"
-            "<gpx xmlns=\"http://www.topografix.com/GPX/1/1\" xmlns:gpxx=\"http://www.garmin.com/xmlschemas/GpxExtensions/v3\"\r\n"
-            " xmlns:gpxtpx=\"http://www.garmin.com/xmlschemas/TrackPointExtension/v1\"\r\n"
-            " xmlns:xsi=\"http://www.w3.org/2001/XMLSchema-instance\" creator=\"eTrex 30\" version=\"1.1\"\r\n"
-            " xsi:schemaLocation=\"http://www.topografix.com/GPX/1/1 http://www.topografix.com/GPX/1/1/gpx.xsd\">\r\n"
+            "<gpx xmlns=\"http://example.org/GPX/1/1\" xmlns:gpxx=\"http://example.org/schemas/GpxExtensions/v3\"\r\n"
+            " xmlns:gpxtpx=\"http://example.org/schemas/TrackPointExtension/v1\"\r\n"
+            " xmlns:xsi=\"http://www.w3.org/2001/XMLSchema-instance\" creator=\"Handheld 30\" version=\"1.1\"\r\n"
+            " xsi:schemaLocation=\"http://example.org/GPX/1/1 http://example.org/GPX/1/1/gpx.xsd\">\r\n"
             "  <metadata><link href=\"http://example.org\"><text>x</text></link><time>2021-06-01T08:00:00Z</time></metadata>\r\n"
             "  <trk><name>Ride</name><extensions><gpxx:TrackExtension><gpxx:DisplayColor>Red</gpxx:DisplayColor>"
             "</gpxx:TrackExtension></extensions>\r\n"
@@ -173,7 +173,7 @@ private slots:
             "    </trkseg>\r\n  </trk>\r\n</gpx>\r\n";
         TrackFile file;
         QVERIFY(file.load(write("device.gpx", device)));
-        QCOMPARE(file.creator(), QStringLiteral("eTrex 30"));
+        QCOMPARE(file.creator(), QStringLiteral("Handheld 30"));
         QCOMPARE(file.time(), QStringLiteral("2021-06-01T08:00:00Z"));
         QCOMPARE(file.items().size(), size_t(1));
         const QVector<TrackPoint> &p = file.items()[0].points;
@@ -196,7 +196,7 @@ private slots:
         QCOMPARE(file.items()[0].points[0].name, QStringLiteral("Zürich"));
 
         // A GPX 1.0 file with a prefixed root: local names decide.
-        QVERIFY(file.load(write("prefixed.gpx", "<g:gpx xmlns:g=\"http://www.topografix.com/GPX/1/0\"><g:rte>"
+        QVERIFY(file.load(write("prefixed.gpx", "<g:gpx xmlns:g=\"http://example.org/GPX/1/0\"><g:rte>"
                                                 "<g:rtept lat=\"1\" lon=\"1\"><g:name>R</g:name></g:rtept></g:rte></g:gpx>")));
         QCOMPARE(file.items()[0].points[0].name, QStringLiteral("R"));
     }
@@ -258,7 +258,7 @@ private slots:
     {
         const QByteArray kml =
             "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
-            "<kml xmlns=\"http://www.opengis.net/kml/2.2\" xmlns:gx=\"http://www.google.com/kml/ext/2.2\">\n"
+            "<kml xmlns=\"http://www.opengis.net/kml/2.2\" xmlns:gx=\"http://example.org/kml/ext\">\n"
             "<Document><name>Doc</name><Style id=\"s\"><LineStyle><width>4</width></LineStyle></Style>\n"
             "<Folder><name>first</name>\n"
             "<Placemark><name>Start</name><Point><coordinates>7.1,46.1,500</coordinates></Point></Placemark>\n"
@@ -312,8 +312,8 @@ private slots:
     {
         const QByteArray tcx =
             "\xEF\xBB\xBF<?xml version=\"1.0\" encoding=\"UTF-8\"?>\r\n"
-            "<TrainingCenterDatabase xmlns=\"http://www.garmin.com/xmlschemas/TrainingCenterDatabase/v2\" "
-            "xmlns:ns3=\"http://www.garmin.com/xmlschemas/ActivityExtension/v2\">\r\n"
+            "<TrainingCenterDatabase xmlns=\"http://example.org/schemas/TrainingCenterDatabase/v2\" "
+            "xmlns:ns3=\"http://example.org/schemas/ActivityExtension/v2\">\r\n"
             "<Activities><Activity Sport=\"Biking\"><Id>2020-01-01T00:00:00Z</Id>\r\n"
             "<Lap StartTime=\"2020-01-01T00:00:00Z\"><TotalTimeSeconds>10</TotalTimeSeconds><Track>\r\n"
             "<Trackpoint><Time>t</Time><Position><LatitudeDegrees>46.5</LatitudeDegrees>"
@@ -350,7 +350,7 @@ private slots:
 
     void trkLines()
     {
-        // Windows code page, with the degree sign as one byte.
+        // Code page 1252, with the degree sign as one byte.
         QByteArray latin1 = "G  WGS 84\r\nU  1\r\n"
                             "T  A 47.2512450000\xBAN 8.5465310000\xBA" "E 17-Jul-13 10:36:52.000 s 408.0 0.0 0.0 0.0 0 -1000.0\r\n"
                             "T  A 47.2600000000\xBAS 8.5500000000\xBA" "E 17-Jul-13 10:36:53.000 s 409.0\r\n"
