@@ -1,3 +1,4 @@
+#include "CliRun.h"
 #include "path/PathManager.h"
 #include "project/DocumentFile.h"
 #include "project/PainterPathRenderer_Controller.h"
@@ -5,7 +6,6 @@
 #include <QFile>
 #include <QJsonDocument>
 #include <QJsonObject>
-#include <QProcess>
 #include <QSet>
 #include <QTemporaryDir>
 #include <QTest>
@@ -13,21 +13,6 @@
 #include <cmath>
 
 namespace {
-
-struct Run
-{
-    int exitCode = -1;
-    QByteArray out;
-    QByteArray err;
-};
-
-Run cli(const QStringList &args)
-{
-    QProcess process;
-    process.start(QStringLiteral(TOURLET_CLI), args);
-    process.waitForFinished(60000);
-    return {process.exitCode(), process.readAllStandardOutput(), process.readAllStandardError()};
-}
 
 QList<QJsonObject> lines(const QByteArray &out)
 {
@@ -81,7 +66,7 @@ private slots:
 
     void summaryAndLines()
     {
-        Run run = cli({QStringLiteral("events"), m_project, QStringLiteral("--linear"), QStringLiteral("0"),
+        CliRun run = runCli({QStringLiteral("events"), m_project, QStringLiteral("--linear"), QStringLiteral("0"),
                        QStringLiteral("--summary")});
         QCOMPARE(run.exitCode, 0);
         const QJsonObject summary = QJsonDocument::fromJson(run.out).object();
@@ -102,7 +87,7 @@ private slots:
         QCOMPARE(summary.value(QStringLiteral("events")).toInt(), all);
         QVERIFY(summary.value(QStringLiteral("pilotSteps")).toInt() > 0);
 
-        run = cli({QStringLiteral("events"), m_project, QStringLiteral("--linear"), QStringLiteral("0")});
+        run = runCli({QStringLiteral("events"), m_project, QStringLiteral("--linear"), QStringLiteral("0")});
         QCOMPARE(run.exitCode, 0);
         const QList<QJsonObject> events = lines(run.out);
         QCOMPARE(events.size(), all);
@@ -135,16 +120,16 @@ private slots:
                          e.value(QStringLiteral("cKpId")) == first;
             return steps;
         };
-        Run run = cli({QStringLiteral("events"), m_project, QStringLiteral("--linear"), QStringLiteral("0")});
+        CliRun run = runCli({QStringLiteral("events"), m_project, QStringLiteral("--linear"), QStringLiteral("0")});
         QCOMPARE(run.exitCode, 0);
         const int byDuration = stepsOfFirstLeg(lines(run.out));
         QVERIFY2(byDuration >= 91 && byDuration <= 92, qPrintable(QString::number(byDuration)));
-        run = cli({QStringLiteral("events"), m_project}); // the document's default is linear
+        run = runCli({QStringLiteral("events"), m_project}); // the document's default is linear
         QCOMPARE(run.exitCode, 0);
         const int byDistance = stepsOfFirstLeg(lines(run.out));
         QVERIFY2(byDistance > 30 && byDistance < 80, qPrintable(QString::number(byDistance)));
 
-        run = cli({QStringLiteral("events"), m_project, QStringLiteral("--flyin"), QStringLiteral("1"),
+        run = runCli({QStringLiteral("events"), m_project, QStringLiteral("--flyin"), QStringLiteral("1"),
                    QStringLiteral("--linear"), QStringLiteral("0")});
         QCOMPARE(run.exitCode, 0);
         const QList<QJsonObject> events = lines(run.out);
@@ -163,17 +148,17 @@ private slots:
 
     void badInput()
     {
-        Run run = cli({QStringLiteral("events"), m_dir.filePath(QStringLiteral("missing.zkgeo"))});
+        CliRun run = runCli({QStringLiteral("events"), m_dir.filePath(QStringLiteral("missing.zkgeo"))});
         QVERIFY(run.exitCode != 0);
         QVERIFY(run.out.isEmpty());
         QCOMPARE(run.err.count('\n'), 1);
 
-        run = cli({QStringLiteral("events"), m_project, QStringLiteral("--linear"), QStringLiteral("2")});
+        run = runCli({QStringLiteral("events"), m_project, QStringLiteral("--linear"), QStringLiteral("2")});
         QVERIFY(run.exitCode != 0);
         QVERIFY(run.err.contains("--linear"));
-        run = cli({QStringLiteral("events"), m_project, QStringLiteral("--flyin")});
+        run = runCli({QStringLiteral("events"), m_project, QStringLiteral("--flyin")});
         QVERIFY(run.exitCode != 0);
-        run = cli({QStringLiteral("events")});
+        run = runCli({QStringLiteral("events")});
         QVERIFY(run.exitCode != 0);
 
         const QString junk = m_dir.filePath(QStringLiteral("junk.txt"));
@@ -181,7 +166,7 @@ private slots:
         QVERIFY(file.open(QIODevice::WriteOnly));
         file.write("neither a project nor a track\n");
         file.close();
-        run = cli({QStringLiteral("events"), junk, QStringLiteral("--summary")});
+        run = runCli({QStringLiteral("events"), junk, QStringLiteral("--summary")});
         QVERIFY(run.exitCode != 0);
         QVERIFY(run.out.isEmpty());
     }

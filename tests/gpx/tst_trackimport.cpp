@@ -1,3 +1,4 @@
+#include "CliRun.h"
 #include "gpx/GpxWriter.h"
 #include "gpx/TrackFile.h"
 #include "gpx/TrackImport.h"
@@ -8,7 +9,6 @@
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
-#include <QProcess>
 #include <QTemporaryDir>
 #include <QTest>
 #include <QXmlStreamReader>
@@ -274,12 +274,10 @@ private slots:
     {
         const QString file = write(QStringLiteral("cli.gpx"), gpxTrack(300));
         const QString out = m_dir.filePath(QStringLiteral("cli-out.gpx"));
-        QProcess cli;
-        cli.start(QStringLiteral(TOURLET_CLI), {QStringLiteral("track"), file, QStringLiteral("--aliasing"),
-                                                QStringLiteral("0"), QStringLiteral("--write-gpx"), out});
-        QVERIFY(cli.waitForFinished(60000));
-        QCOMPARE(cli.exitCode(), 0);
-        const QJsonObject json = QJsonDocument::fromJson(cli.readAllStandardOutput()).object();
+        const CliRun run = runCli({QStringLiteral("track"), file, QStringLiteral("--aliasing"), QStringLiteral("0"),
+                                   QStringLiteral("--write-gpx"), out});
+        QCOMPARE(run.exitCode, 0);
+        const QJsonObject json = QJsonDocument::fromJson(run.out).object();
         QCOMPARE(json.value(QStringLiteral("creator")).toString(), QStringLiteral("device"));
         QCOMPARE(json.value(QStringLiteral("fixedCurve")).toBool(), true);
         const QJsonArray samples = json.value(QStringLiteral("curvePoints")).toArray();
@@ -296,19 +294,14 @@ private slots:
         QVERIFY(written.isOwnFile());
         QCOMPARE(written.items().front().points.size(), 300);
 
-        QProcess bad;
-        bad.start(QStringLiteral(TOURLET_CLI), {QStringLiteral("track"), write(QStringLiteral("bad.gpx"), "not xml")});
-        QVERIFY(bad.waitForFinished(60000));
-        QCOMPARE(bad.exitCode(), 1);
-        QVERIFY(bad.readAllStandardOutput().isEmpty());
-        const QByteArray message = bad.readAllStandardError().trimmed();
+        const CliRun bad = runCli({QStringLiteral("track"), write(QStringLiteral("bad.gpx"), "not xml")});
+        QCOMPARE(bad.exitCode, 1);
+        QVERIFY(bad.out.isEmpty());
+        const QByteArray message = bad.err.trimmed();
         QVERIFY(!message.isEmpty());
         QVERIFY(!message.contains('\n'));
 
-        QProcess wrongAliasing;
-        wrongAliasing.start(QStringLiteral(TOURLET_CLI), {QStringLiteral("track"), file, QStringLiteral("--aliasing"), QStringLiteral("7")});
-        QVERIFY(wrongAliasing.waitForFinished(60000));
-        QVERIFY(wrongAliasing.exitCode() != 0);
+        QVERIFY(runCli({QStringLiteral("track"), file, QStringLiteral("--aliasing"), QStringLiteral("7")}).exitCode != 0);
     }
 };
 

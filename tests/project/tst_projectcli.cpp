@@ -1,8 +1,8 @@
+#include "CliRun.h"
 #include <QFile>
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
-#include <QProcess>
 #include <QTemporaryDir>
 #include <QTest>
 
@@ -10,21 +10,6 @@
 #include <cmath>
 
 namespace {
-
-struct Run
-{
-    int exitCode = -1;
-    QByteArray out;
-    QByteArray err;
-};
-
-Run cli(const QStringList &args)
-{
-    QProcess process;
-    process.start(QStringLiteral(TOURLET_CLI), args);
-    process.waitForFinished(60000);
-    return {process.exitCode(), process.readAllStandardOutput(), process.readAllStandardError()};
-}
 
 void writeText(const QString &file, const QByteArray &text)
 {
@@ -55,11 +40,11 @@ private slots:
                           "[pathSegments]\nelements=2\n[pathsegment0]\npilot_width=77.5\n[pathsegment1]\npilot_source=/b.png\n"
                           "[photopool]\nsize=1\n[photopool_item0]\npath=/gone/p.jpg\ntime=2019:05:04 10:11:12\n");
         const QString converted = path("converted.zkgeo");
-        Run run = cli({QStringLiteral("convert"), source, QStringLiteral("-o"), converted});
+        CliRun run = runCli({QStringLiteral("convert"), source, QStringLiteral("-o"), converted});
         QCOMPARE(run.exitCode, 0);
         QVERIFY(QFile::exists(converted));
 
-        run = cli({QStringLiteral("project"), converted});
+        run = runCli({QStringLiteral("project"), converted});
         QCOMPARE(run.exitCode, 0);
         const QJsonObject doc = QJsonDocument::fromJson(run.out).object();
         const QJsonObject fields = doc.value(QStringLiteral("fields")).toObject();
@@ -105,20 +90,20 @@ private slots:
         const QString track = path("alps.gpx");
         writeText(track, gpx);
 
-        Run run = cli({QStringLiteral("project"), track});
+        CliRun run = runCli({QStringLiteral("project"), track});
         QCOMPARE(run.exitCode, 0);
         const QJsonObject opened = QJsonDocument::fromJson(run.out).object();
         QCOMPARE(opened.value(QStringLiteral("kind")).toString(), QStringLiteral("track"));
 
         const QString out = path("alps.zkgeo");
-        run = cli({QStringLiteral("convert"), track, QStringLiteral("-o"), out, QStringLiteral("--aliasing"), QStringLiteral("3")});
+        run = runCli({QStringLiteral("convert"), track, QStringLiteral("-o"), out, QStringLiteral("--aliasing"), QStringLiteral("3")});
         QCOMPARE(run.exitCode, 0);
         const QJsonObject converted = QJsonDocument::fromJson(run.out).object();
         QCOMPARE(converted.value(QStringLiteral("kind")).toString(), QStringLiteral("track"));
         const int maxSamples = converted.value(QStringLiteral("curvePointCount")).toInt();
         QVERIFY(maxSamples >= 4000);
 
-        run = cli({QStringLiteral("project"), out});
+        run = runCli({QStringLiteral("project"), out});
         QCOMPARE(run.exitCode, 0);
         const QJsonObject doc = QJsonDocument::fromJson(run.out).object();
         QCOMPARE(doc.value(QStringLiteral("kind")).toString(), QStringLiteral("project"));
@@ -141,11 +126,11 @@ private slots:
         QCOMPARE(fields.value(QStringLiteral("centerPosition/latitude")).toDouble(), (south + north) / 2);
 
         // Less thinning means more samples; a value out of the list is refused.
-        run = cli({QStringLiteral("convert"), track, QStringLiteral("-o"), path("thin.zkgeo"), QStringLiteral("--aliasing"),
+        run = runCli({QStringLiteral("convert"), track, QStringLiteral("-o"), path("thin.zkgeo"), QStringLiteral("--aliasing"),
                    QStringLiteral("2")});
         QCOMPARE(run.exitCode, 0);
         QVERIFY(QJsonDocument::fromJson(run.out).object().value(QStringLiteral("curvePointCount")).toInt() < maxSamples);
-        run = cli({QStringLiteral("convert"), track, QStringLiteral("-o"), path("never.zkgeo"), QStringLiteral("--aliasing"),
+        run = runCli({QStringLiteral("convert"), track, QStringLiteral("-o"), path("never.zkgeo"), QStringLiteral("--aliasing"),
                    QStringLiteral("4")});
         QVERIFY(run.exitCode != 0);
         QVERIFY(!QFile::exists(path("never.zkgeo")));
@@ -155,7 +140,7 @@ private slots:
     {
         const QString foreign = path("notes.txt");
         writeText(foreign, "just some text\n");
-        Run run = cli({QStringLiteral("project"), foreign});
+        CliRun run = runCli({QStringLiteral("project"), foreign});
         QCOMPARE(run.exitCode, 1);
         QVERIFY(run.out.isEmpty());
         QVERIFY(run.err.contains("notes.txt"));
@@ -163,17 +148,17 @@ private slots:
 
         const QString damaged = path("damaged.zkgeo");
         writeText(damaged, "[Header]\nprojecttype=ZKGEO\nprojectversion=2\n[flyIn]\nduration=five\n");
-        run = cli({QStringLiteral("project"), damaged});
+        run = runCli({QStringLiteral("project"), damaged});
         QCOMPARE(run.exitCode, 2);
         QVERIFY(run.err.contains("damaged.zkgeo"));
         QVERIFY(run.err.contains("damaged number"));
-        run = cli({QStringLiteral("convert"), damaged, QStringLiteral("-o"), path("never.zkgeo")});
+        run = runCli({QStringLiteral("convert"), damaged, QStringLiteral("-o"), path("never.zkgeo")});
         QCOMPARE(run.exitCode, 2);
         QVERIFY(!QFile::exists(path("never.zkgeo")));
 
-        run = cli({QStringLiteral("convert"), foreign, QStringLiteral("-o"), path("never.zkgeo")});
+        run = runCli({QStringLiteral("convert"), foreign, QStringLiteral("-o"), path("never.zkgeo")});
         QCOMPARE(run.exitCode, 1);
-        run = cli({QStringLiteral("convert"), foreign});
+        run = runCli({QStringLiteral("convert"), foreign});
         QCOMPARE(run.exitCode, 1);
     }
 };
