@@ -2,9 +2,8 @@
 
 #include "path/ContentPath.h"
 #include "path/PointRecord.h"
-#include "platform/PictureMetadata.h"
 
-KeyPoint::KeyPoint(double x_, double y_, double z_) : BasePoint(x_, y_, z_), longitude(x_), latitude(y_), altitude(z_) {}
+KeyPoint::KeyPoint(double x_, double y_, double z_) : GeoPoint(x_, y_, z_) {}
 
 KeyPoint::KeyPoint(double x_, double y_, double z_, const QString &name_) : KeyPoint(x_, y_, z_)
 {
@@ -29,44 +28,16 @@ KeyPoint::~KeyPoint() = default;
 
 void KeyPoint::makeEmptyKeyPoint()
 {
-    makeEmpty();
-    longitude = latitude = altitude = 0.0;
-    name.clear();
-    type = 1;
+    makeEmptyGeo();
     properties.reset();
     correspondingPathSegmentId = 0;
-}
-
-void KeyPoint::setLongitude(double value, bool alsoBase)
-{
-    longitude = value;
-    if (alsoBase)
-        x = value;
-}
-
-void KeyPoint::setLatitude(double value, bool alsoBase)
-{
-    latitude = value;
-    if (alsoBase)
-        y = value;
-}
-
-void KeyPoint::setAltitude(double value, bool alsoBase)
-{
-    altitude = value;
-    if (alsoBase)
-        z = value;
 }
 
 bool KeyPoint::Save(ProjectController &store, QString section) const
 {
     BasePoint::Save(store, section);
     const PointRecordWriter out(store, section);
-    out.writeCoordinate(QStringLiteral("longitude"), longitude);
-    out.writeCoordinate(QStringLiteral("latitude"), latitude);
-    out.writeCoordinate(QStringLiteral("altitude"), altitude);
-    out.write(QStringLiteral("name"), name);
-    out.write(QStringLiteral("type"), type);
+    saveGeo(out);
 
     const KeyPointProperties &p = properties;
     out.write(QStringLiteral("kppTitle"), p.title);
@@ -93,11 +64,7 @@ bool KeyPoint::Load(ProjectController &store, QString section)
 {
     BasePoint::Load(store, section);
     const PointRecordReader in(store, section);
-    in.read(QStringLiteral("longitude"), longitude);
-    in.read(QStringLiteral("latitude"), latitude);
-    in.read(QStringLiteral("altitude"), altitude);
-    in.read(QStringLiteral("name"), name);
-    in.read(QStringLiteral("type"), type);
+    loadGeo(in);
 
     KeyPointProperties &p = properties;
     in.read(QStringLiteral("kppTitle"), p.title);
@@ -119,10 +86,8 @@ bool KeyPoint::Load(ProjectController &store, QString section)
         p.mediaSource = rebaseContentPath(p.mediaSource);
 
     if (!p.mediaSource.isEmpty()) {
-        if (const auto orientation = readPictureOrientation(localFilePath(p.mediaSource))) {
-            if (const auto rotation = rotationForOrientation(*orientation))
-                p.mediaRotation = *rotation;
-        }
+        if (const auto rotation = pictureRotation(p.mediaSource))
+            p.mediaRotation = *rotation;
     }
 
     p.font.load(in);

@@ -1,12 +1,12 @@
 #pragma once
 
-#include "path/BasePoint.h"
+#include "path/GeoPoint.h"
 #include "path/KeyPointProperties.h"
 
 // A waypoint. Besides x, y, z it keeps a geographic position of its own: the
 // two sets are equal after an ordinary edit, but scaling of the path moves
 // x and y only.
-class KeyPoint : public BasePoint
+class KeyPoint : public GeoPoint
 {
 public:
     KeyPoint() = default;
@@ -22,19 +22,8 @@ public:
     bool Save(ProjectController &store, QString section) const override;
     bool Load(ProjectController &store, QString section) override;
 
-    // alsoBase: move x, y or z along; false for points that only carry a
-    // geographic value.
-    void setLongitude(double value, bool alsoBase);
-    void setLatitude(double value, bool alsoBase);
-    void setAltitude(double value, bool alsoBase);
-
     QString title() const { return properties.title; }
 
-    double longitude = 0.0;
-    double latitude = 0.0;
-    double altitude = 0.0;
-    QString name;
-    int32_t type = 1;
     KeyPointProperties properties;
     // Id of the path segment that starts here; an index while in the file.
     uint32_t correspondingPathSegmentId = 0;

@@ -1,24 +1,13 @@
 #include "path/MediaPoint.h"
 
 #include "app/Trace.h"
-#include "path/ContentPath.h"
 #include "path/DefaultTitle.h"
 #include "path/PointRecord.h"
-#include "platform/PictureMetadata.h"
 
 namespace {
 QString imageSourceKey(int index)
 {
     return QStringLiteral("mppImageSource%1").arg(index);
-}
-
-int32_t orientationOfPicture(const QString &path)
-{
-    if (const auto orientation = readPictureOrientation(localFilePath(path))) {
-        if (const auto rotation = rotationForOrientation(*orientation))
-            return *rotation;
-    }
-    return 0;
 }
 }
 
@@ -33,7 +22,7 @@ void MediaPointProperties::reset()
     spare = 0;
 }
 
-MediaPoint::MediaPoint(double x_, double y_, double z_) : BasePoint(x_, y_, z_), longitude(x_), latitude(y_), altitude(z_) {}
+MediaPoint::MediaPoint(double x_, double y_, double z_) : GeoPoint(x_, y_, z_) {}
 
 MediaPoint::MediaPoint(MediaPoint &&other) noexcept : MediaPoint(static_cast<const MediaPoint &>(other))
 {
@@ -53,43 +42,15 @@ MediaPoint::~MediaPoint() = default;
 
 void MediaPoint::makeEmptyMediaPoint()
 {
-    makeEmpty();
-    longitude = latitude = altitude = 0.0;
-    name.clear();
-    type = 1;
+    makeEmptyGeo();
     properties.reset();
-}
-
-void MediaPoint::setLongitude(double value, bool alsoBase)
-{
-    longitude = value;
-    if (alsoBase)
-        x = value;
-}
-
-void MediaPoint::setLatitude(double value, bool alsoBase)
-{
-    latitude = value;
-    if (alsoBase)
-        y = value;
-}
-
-void MediaPoint::setAltitude(double value, bool alsoBase)
-{
-    altitude = value;
-    if (alsoBase)
-        z = value;
 }
 
 bool MediaPoint::Save(ProjectController &store, QString section) const
 {
     BasePoint::Save(store, section);
     const PointRecordWriter out(store, section);
-    out.writeCoordinate(QStringLiteral("longitude"), longitude);
-    out.writeCoordinate(QStringLiteral("latitude"), latitude);
-    out.writeCoordinate(QStringLiteral("altitude"), altitude);
-    out.write(QStringLiteral("name"), name);
-    out.write(QStringLiteral("type"), type);
+    saveGeo(out);
 
     const MediaPointProperties &p = properties;
     out.write(QStringLiteral("mppTitle"), p.title);
@@ -107,11 +68,7 @@ bool MediaPoint::Load(ProjectController &store, QString section)
 {
     BasePoint::Load(store, section);
     const PointRecordReader in(store, section);
-    in.read(QStringLiteral("longitude"), longitude);
-    in.read(QStringLiteral("latitude"), latitude);
-    in.read(QStringLiteral("altitude"), altitude);
-    in.read(QStringLiteral("name"), name);
-    in.read(QStringLiteral("type"), type);
+    loadGeo(in);
 
     MediaPointProperties &p = properties;
     in.read(QStringLiteral("mppTitle"), p.title);
@@ -132,7 +89,7 @@ bool MediaPoint::Load(ProjectController &store, QString section)
                      imageSourceKey(i), i, count);
             break;
         }
-        p.imageSources.append(MediaFile{path, orientationOfPicture(path)});
+        p.imageSources.append(MediaFile{path, pictureRotation(path).value_or(0)});
     }
     return true;
 }

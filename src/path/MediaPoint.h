@@ -1,6 +1,6 @@
 #pragma once
 
-#include "path/BasePoint.h"
+#include "path/GeoPoint.h"
 
 #include <QVector>
 
@@ -27,7 +27,7 @@ struct MediaPointProperties
 };
 
 // A place on the route where photographs are shown.
-class MediaPoint : public BasePoint
+class MediaPoint : public GeoPoint
 {
 public:
     MediaPoint() = default;
@@ -43,17 +43,8 @@ public:
     bool Save(ProjectController &store, QString section) const override;
     bool Load(ProjectController &store, QString section) override;
 
-    void setLongitude(double value, bool alsoBase);
-    void setLatitude(double value, bool alsoBase);
-    void setAltitude(double value, bool alsoBase);
-
     QString title() const { return properties.title; }
 
-    double longitude = 0.0;
-    double latitude = 0.0;
-    double altitude = 0.0;
-    QString name;
-    int32_t type = 1;
     MediaPointProperties properties;
 
 private:
