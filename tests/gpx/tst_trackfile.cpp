@@ -1,3 +1,4 @@
+#include "TestFiles.h"
 #include "gpx/TrackFile.h"
 
 #include <QBuffer>
@@ -14,14 +15,7 @@ class TestTrackFile : public QObject
 private:
     QTemporaryDir m_dir;
 
-    QString write(const QString &name, const QByteArray &bytes) const
-    {
-        const QString file = m_dir.filePath(name);
-        QFile f(file);
-        if (!f.open(QIODevice::WriteOnly) || f.write(bytes) != bytes.size())
-            qFatal("cannot write test file");
-        return file;
-    }
+    QString write(const QString &name, const QByteArray &bytes) const { return writeTestFile(m_dir, name, bytes); }
     static QByteArray gpx(const QByteArray &body, const QByteArray &rootAttributes = QByteArray())
     {
         return "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<gpx version=\"1.1\"" + rootAttributes + ">\n" + body + "</gpx>\n";

@@ -1,3 +1,4 @@
+#include "TestFiles.h"
 #include "CliRun.h"
 #include "gpx/GpxWriter.h"
 #include "gpx/TrackFile.h"
@@ -46,14 +47,7 @@ class TestTrackImport : public QObject
 private:
     QTemporaryDir m_dir;
 
-    QString write(const QString &name, const QByteArray &bytes) const
-    {
-        const QString file = m_dir.filePath(name);
-        QFile f(file);
-        if (!f.open(QIODevice::WriteOnly) || f.write(bytes) != bytes.size())
-            qFatal("cannot write test file");
-        return file;
-    }
+    QString write(const QString &name, const QByteArray &bytes) const { return writeTestFile(m_dir, name, bytes); }
 
     static Path ordinaryRoute()
     {
