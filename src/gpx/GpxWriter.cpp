@@ -7,35 +7,6 @@
 #include <QFile>
 #include <QXmlStreamWriter>
 
-#include <algorithm>
-
-namespace {
-
-struct Corners
-{
-    double minLon, minLat, maxLon, maxLat;
-};
-
-// The path's extent; a path without one (all corners 0) takes that of its samples.
-Corners cornersOf(const Path &path, const std::vector<CurvePoint> &samples)
-{
-    const KeyPoint &a = path.boundaryMin, &b = path.boundaryMax;
-    const bool unset = a.longitude == 0 && a.latitude == 0 && b.longitude == 0 && b.latitude == 0;
-    if (!unset || samples.empty()) {
-        return {std::min(a.longitude, b.longitude), std::min(a.latitude, b.latitude),
-                std::max(a.longitude, b.longitude), std::max(a.latitude, b.latitude)};
-    }
-    Corners c{samples.front().x, samples.front().y, samples.front().x, samples.front().y};
-    for (const CurvePoint &p : samples) {
-        c.minLon = std::min(c.minLon, p.x);
-        c.maxLon = std::max(c.maxLon, p.x);
-        c.minLat = std::min(c.minLat, p.y);
-        c.maxLat = std::max(c.maxLat, p.y);
-    }
-    return c;
-}
-
-} // namespace
 
 bool GpxWriter::write(const QString &fileName, const std::vector<CurvePoint> &samples, const Path &path)
 {
@@ -55,13 +26,13 @@ bool GpxWriter::write(const QString &fileName, const std::vector<CurvePoint> &sa
     xml.writeStartElement(QStringLiteral("gpx"));
     xml.writeAttribute(QStringLiteral("creator"), QStringLiteral("Tourlet"));
 
-    const Corners corners = cornersOf(path, samples);
+    const Path::Extent corners = path.extent();
     xml.writeStartElement(QStringLiteral("metadata"));
     xml.writeStartElement(QStringLiteral("bounds"));
-    xml.writeAttribute(QStringLiteral("minlong"), formatCoordinate(corners.minLon));
-    xml.writeAttribute(QStringLiteral("minlat"), formatCoordinate(corners.minLat));
-    xml.writeAttribute(QStringLiteral("maxlong"), formatCoordinate(corners.maxLon));
-    xml.writeAttribute(QStringLiteral("maxlat"), formatCoordinate(corners.maxLat));
+    xml.writeAttribute(QStringLiteral("minlong"), formatCoordinate(corners.west));
+    xml.writeAttribute(QStringLiteral("minlat"), formatCoordinate(corners.south));
+    xml.writeAttribute(QStringLiteral("maxlong"), formatCoordinate(corners.east));
+    xml.writeAttribute(QStringLiteral("maxlat"), formatCoordinate(corners.north));
     xml.writeEndElement();
     xml.writeEndElement();
 

@@ -431,6 +431,36 @@ void Path::setBoundaries(const KeyPoint &min, const KeyPoint &max)
     logTrace(0, QStringLiteral("Path::setBoundaries() %f, %f"), min.longitude, min.latitude);
 }
 
+Path::Extent Path::extent() const
+{
+    const KeyPoint &a = boundaryMin, &b = boundaryMax;
+    const bool unset = a.longitude == 0 && a.latitude == 0 && b.longitude == 0 && b.latitude == 0;
+    if (!unset)
+        return {std::min(a.longitude, b.longitude), std::min(a.latitude, b.latitude),
+                std::max(a.longitude, b.longitude), std::max(a.latitude, b.latitude)};
+
+    bool first = true;
+    Extent e{0, 0, 0, 0};
+    auto include = [&](double px, double py) {
+        if (first) {
+            e = {px, py, px, py};
+            first = false;
+            return;
+        }
+        e.west = std::min(e.west, px);
+        e.east = std::max(e.east, px);
+        e.south = std::min(e.south, py);
+        e.north = std::max(e.north, py);
+    };
+    for (const CurvePoint &p : curvePoints)
+        include(p.x, p.y);
+    if (curvePoints.empty()) {
+        for (const KeyPoint &p : keyPoints)
+            include(p.x, p.y);
+    }
+    return e;
+}
+
 KeyPoint Path::centerPosition() const
 {
     KeyPoint center;

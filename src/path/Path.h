@@ -63,6 +63,14 @@ public:
     void update(bool force = false);
     void setBoundaries(const KeyPoint &min, const KeyPoint &max);
     KeyPoint centerPosition() const;
+    // The extent in degrees: the stored boundaries, or, where none are set (all
+    // corners 0), that of the samples, or of the key points of a path without
+    // samples. All 0 for an empty path.
+    struct Extent
+    {
+        double west, south, east, north;
+    };
+    Extent extent() const;
     void setGeoMetry(double width, double height);
 
     int percentToCurveIndex(double percent) const;
