@@ -81,6 +81,11 @@ QString LanguageTable::referenceFilePath(const QString &programDir)
     return inLanguageFolder(QStringLiteral("Tourlet.qm"), programDir);
 }
 
+QString LanguageTable::helpFilePath(int index, const QString &programDir)
+{
+    return QStringLiteral("%1/Help/Tourlet%2.pdf").arg(programDir, shortSuffix(index));
+}
+
 int LanguageTable::indexForHostName(const QString &name)
 {
     for (int i = 0; i < Count; ++i) {

@@ -31,6 +31,8 @@ public:
     static QString filePath(int index, const QString &programDir = QString());
     // "language/Tourlet.qm", the copy of the installer's language.
     static QString referenceFilePath(const QString &programDir = QString());
+    // "<programDir>/Help/Tourlet_DE.pdf", the user guide that openHelp shows.
+    static QString helpFilePath(int index, const QString &programDir);
 
     // Index whose accepted host names include name (exact match), or -1.
     static int indexForHostName(const QString &name);
