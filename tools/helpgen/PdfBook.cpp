@@ -10,13 +10,14 @@
 #include <QTextBlock>
 #include <QTextDocument>
 #include <QTextLayout>
+#include <QTextTable>
 
 namespace {
 
 constexpr qreal FooterHeightPt = 24.0;
 constexpr qreal FooterFontPt = 8.0;
-// A heading or lead-in keeps at least this many lines of what follows it on its page;
-// a figure keeps its caption whole.
+// A heading or lead-in keeps at least this many lines of what follows it on its page,
+// or the whole of a table up to half a page; a figure keeps its caption whole.
 constexpr int LinesKeptWithLeadIn = 3;
 
 const QColor FooterColour(0x6b, 0x76, 0x7d);
@@ -62,7 +63,10 @@ void PdfBook::keepWithNext(QTextDocument &document) const
         const QRectF following = layout->blockBoundingRect(next);
         qreal needed = following.height();
         const QTextLayout *lines = next.layout();
-        if (introduces && lines && lines->lineCount() > LinesKeptWithLeadIn)
+        QTextTable *table = QTextCursor(next).currentTable();
+        if (introduces && table && layout->frameBoundingRect(table).height() < pageHeight / 2)
+            needed = layout->frameBoundingRect(table).height();
+        else if (introduces && lines && lines->lineCount() > LinesKeptWithLeadIn)
             needed = lines->lineAt(LinesKeptWithLeadIn - 1).rect().bottom();
         const int ownPage = int(own.top() / pageHeight);
         const int followingPage = int((following.top() + needed) / pageHeight);
