@@ -5,6 +5,7 @@
 #include <QTextDocument>
 #include <QTextFrame>
 #include <QTextTable>
+#include <QVector>
 
 namespace {
 
@@ -39,13 +40,16 @@ void mergeWholeBlock(const QTextBlock &block, const QTextCharFormat &format)
 }
 
 // The importer sizes headings by a relative adjustment, which wins over any point size.
+// Fragments are collected first: changing a format may merge them under an iterator.
 void dropSizeAdjustment(const QTextBlock &block)
 {
-    for (auto it = block.begin(); !it.atEnd(); ++it) {
-        const QTextFragment fragment = it.fragment();
+    QVector<QTextFragment> fragments;
+    for (auto it = block.begin(); !it.atEnd(); ++it)
+        fragments.append(it.fragment());
+    QTextCursor cursor(block);
+    for (const QTextFragment &fragment : fragments) {
         QTextCharFormat format = fragment.charFormat();
         format.clearProperty(QTextFormat::FontSizeAdjustment);
-        QTextCursor cursor(block);
         cursor.setPosition(fragment.position());
         cursor.setPosition(fragment.position() + fragment.length(), QTextCursor::KeepAnchor);
         cursor.setCharFormat(format);
