@@ -1,10 +1,10 @@
+#include "TestFiles.h"
 #include "gpx/GpxWriter.h"
 #include "project/DocumentFile.h"
 #include "project/PainterPathRenderer_Controller.h"
 #include "project/ValueParsers.h"
 
 #include <QDir>
-#include <QDirIterator>
 #include <QFile>
 #include <QImage>
 #include <QRandomGenerator>
@@ -166,23 +166,6 @@ int writeInChild(const std::function<bool()> &write, Hindrance hindrance)
     if (waitpid(child, &status, 0) != child || !WIFEXITED(status))
         return -1;
     return WEXITSTATUS(status);
-}
-
-// Every entry under a folder with its permissions, and the bytes of files.
-QMap<QString, QByteArray> snapshot(const QString &folder)
-{
-    QMap<QString, QByteArray> entries;
-    QDirIterator it(folder, QDir::AllEntries | QDir::NoDotAndDotDot | QDir::Hidden | QDir::System,
-                    QDirIterator::Subdirectories);
-    while (it.hasNext()) {
-        const QString name = it.next();
-        const QFileInfo info = it.fileInfo();
-        QByteArray &entry = entries[QDir(folder).relativeFilePath(name)];
-        entry = QByteArray::number(int(info.permissions()), 16) + (info.isDir() ? "/" : ":");
-        if (info.isFile())
-            entry += readBytes(name);
-    }
-    return entries;
 }
 
 } // namespace
@@ -701,9 +684,9 @@ private slots:
             }
             return false;
         };
-        const QMap<QString, QByteArray> before = snapshot(folder);
+        const QMap<QString, QByteArray> before = folderSnapshot(folder);
         const int result = writeInChild(write, hinder);
-        const QMap<QString, QByteArray> after = snapshot(folder);
+        const QMap<QString, QByteArray> after = folderSnapshot(folder);
         QFile::setPermissions(folder, QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner);
 
         QCOMPARE(result, written ? 0 : 1);

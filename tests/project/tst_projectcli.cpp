@@ -1,10 +1,10 @@
 #include "CliRun.h"
+#include "TestFiles.h"
 #include "gpx/TrackFile.h"
 #include "project/DocumentFile.h"
 #include "project/PainterPathRenderer_Controller.h"
 
 #include <QDir>
-#include <QDirIterator>
 #include <QFile>
 #include <QJsonArray>
 #include <QJsonDocument>
@@ -22,19 +22,6 @@ void writeText(const QString &file, const QByteArray &text)
     QFile f(file);
     QVERIFY(f.open(QIODevice::WriteOnly));
     f.write(text);
-}
-
-// Every entry under a folder with the bytes of its files.
-QMap<QString, QByteArray> snapshot(const QString &folder)
-{
-    QMap<QString, QByteArray> entries;
-    QDirIterator it(folder, QDir::AllEntries | QDir::NoDotAndDotDot | QDir::Hidden, QDirIterator::Subdirectories);
-    while (it.hasNext()) {
-        const QString name = it.next();
-        QFile file(name);
-        entries[name] = it.fileInfo().isDir() ? QByteArray("/") : (file.open(QIODevice::ReadOnly) ? file.readAll() : "?");
-    }
-    return entries;
 }
 
 // Positions in order, each run of equal positions taken once.
@@ -281,13 +268,13 @@ private slots:
             ? QStringList{command, source, QStringLiteral("--write-gpx"), target}
             : QStringList{command, source, QStringLiteral("-o"), target};
 
-        const QMap<QString, QByteArray> before = snapshot(dir.path());
+        const QMap<QString, QByteArray> before = folderSnapshot(dir.path());
         const CliRun run = folderInTheWay ? runCli(args) : runCliWithFileSizeLimit(4, args);
         QCOMPARE(run.exitCode, 1);
         QCOMPARE(run.err.count('\n'), 1);
         QVERIFY2(run.err.contains(QFile::encodeName(target)), run.err.constData());
         QVERIFY(run.out.isEmpty());
-        QCOMPARE(snapshot(dir.path()), before);
+        QCOMPARE(folderSnapshot(dir.path()), before);
     }
 };
 
