@@ -16,7 +16,7 @@ QString systemError(const QFileDevice &file)
 {
     if (errno != 0)
         return QString::fromLocal8Bit(std::strerror(errno));
-    return file.errorString();
+    return file.error() != QFileDevice::NoError ? file.errorString() : QStringLiteral("not all of it could be written");
 }
 
 } // namespace

@@ -6,6 +6,7 @@
 #include <QHash>
 
 #include <algorithm>
+#include <cerrno>
 #include <cstring>
 
 namespace {
@@ -367,6 +368,7 @@ bool IniFileWriter::writeInto(AtomicFileWriter &file) const
         file.fail(QStringLiteral("not enough memory for the content"));
         return false;
     }
+    errno = 0; // what the failed write leaves there is the reason
     if (!writeTo(file.device())) {
         file.fail();
         return false;

@@ -41,7 +41,7 @@ public:
 
     // Whether anything of the last write went wrong: no file could be made, a
     // property met no writer, or the file could not be put on disk. Cleared by the
-    // next create or open; lastWriteError() then tells why.
+    // next create or open. lastWriteError() tells why.
     bool lastWriteFailed() const { return m_writeFailed; }
     QString lastWriteError() const { return m_writeError; }
 
