@@ -41,22 +41,29 @@ bool ExportWorker::start(int width, int height, double frameRate, const QString 
         logTrace(3, "ExportWorker::start: an encoder exists already");
         return false;
     }
+    m_error.clear();
+    m_fileName = fileName;
     if (EncoderLibrary::owner()) {
         logTrace(3, "ExportWorker::start: the encoder library is in use by another export");
+        m_error = QStringLiteral("another film is being made");
         return false;
     }
     // A fresh load each time: the encoder keeps global state.
     EncoderLibrary::release();
-    if (!EncoderLibrary::load())
+    if (!EncoderLibrary::load()) {
+        m_error = QStringLiteral("the encoder library %1 can't be loaded").arg(EncoderLibrary::filePath());
         return false;
+    }
     auto create = reinterpret_cast<VidcoreCreateExport>(EncoderLibrary::resolve("CreateExport"));
     if (!create) {
         logTrace(3, "ExportWorker::start: no entry CreateExport in %s", EncoderLibrary::filePath());
+        m_error = QStringLiteral("the encoder library %1 is damaged").arg(EncoderLibrary::filePath());
         return false;
     }
     m_export = create(isMp4 ? VidcoreFormatMp4 : VidcoreFormatWmv);
     if (!m_export) {
         logTrace(3, "ExportWorker::start: CreateExport gave no encoder");
+        m_error = QStringLiteral("the encoder library made no encoder");
         return false;
     }
     EncoderLibrary::setOwner(this);
@@ -75,8 +82,14 @@ bool ExportWorker::start(int width, int height, double frameRate, const QString 
     record.bitRate = ExportBitRate;
     const std::wstring name = fileName.toStdWString();
     const bool ready = m_export->operations->open(m_export, name.c_str(), &record);
-    if (!ready)
+    if (!ready) {
         logTrace(3, "ExportWorker::start: the encoder can't open %s at %dx%d", fileName, size.width(), size.height());
+        m_error = QStringLiteral("the film %1 can't be made at %2 x %3: %4")
+                      .arg(fileName)
+                      .arg(size.width())
+                      .arg(size.height())
+                      .arg(encoderError());
+    }
     return ready;
 }
 
@@ -100,8 +113,9 @@ void ExportWorker::exportNextFrame(int frameNumber, QImage *frame)
             picture = picture.convertToFormat(QImage::Format_RGB32);
         logTrace(0, "export frame: %d, %d, %d", picture.width(), picture.height(), qint64(picture.sizeInBytes()));
 
-        m_export->operations->writeFrame(m_export, picture.constBits(), uint32_t(picture.sizeInBytes()),
-                                         VidcoreNextFrame);
+        if (!m_export->operations->writeFrame(m_export, picture.constBits(), uint32_t(picture.sizeInBytes()),
+                                              VidcoreNextFrame))
+            fail(QStringLiteral("the film %1 could not be written: %2").arg(m_fileName, encoderError()));
     }
     logTrace(0, "ExportWorker::exportNextFrame:end %d", frameNumber);
     emit frameExportFinished();
@@ -110,7 +124,8 @@ void ExportWorker::exportNextFrame(int frameNumber, QImage *frame)
 void ExportWorker::finalizeExport()
 {
     if (m_export) {
-        m_export->operations->finish(m_export);
+        if (!m_export->operations->finish(m_export))
+            fail(QStringLiteral("the film %1 could not be completed: %2").arg(m_fileName, encoderError()));
         m_export->operations->close(m_export);
     } else {
         logTrace(3, "QExporter::finishExport: m_export doesn't exist");
@@ -128,6 +143,21 @@ QString ExportWorker::defaultExtension(bool isMp4)
         return QString();
     const wchar_t *text = extension(isMp4 ? VidcoreFormatMp4 : VidcoreFormatWmv);
     return text ? QString::fromWCharArray(text) : QString();
+}
+
+void ExportWorker::fail(const QString &reason)
+{
+    if (hasFailed())
+        return;
+    m_error = reason;
+    logTrace(3, "ExportWorker: %s", reason);
+    emit exportFailed(reason);
+}
+
+QString ExportWorker::encoderError() const
+{
+    const char *text = m_export && m_export->operations->errorText ? m_export->operations->errorText(m_export) : nullptr;
+    return text && *text ? QString::fromUtf8(text) : QStringLiteral("the encoder gave no reason");
 }
 
 void ExportWorker::releaseLibrary()

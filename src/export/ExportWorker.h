@@ -31,6 +31,12 @@ public:
 
     bool hasEncoder() const { return m_export != nullptr; }
 
+    // Whether the film of the last start is lost: it could not be opened, a frame or
+    // its end could not be written (a full disk, a size limit). The file named at the
+    // start is then untouched. Cleared by the next start.
+    bool hasFailed() const { return !m_error.isEmpty(); }
+    QString errorString() const { return m_error; }
+
 public slots:
     void exportNextFrame(int frameNumber, QImage *frame);
     void finalizeExport();
@@ -38,11 +44,18 @@ public slots:
 signals:
     void frameExportFinished();
     void finalized();
+    // Once per export, as soon as the film is known to be lost; the export should
+    // stop. finalized() still follows finalizeExport().
+    void exportFailed(const QString &reason);
 
 private:
     void releaseLibrary();
+    void fail(const QString &reason);
+    QString encoderError() const;
 
     VidcoreExport *m_export = nullptr;
+    QString m_fileName;
+    QString m_error;
 };
 
 Q_DECLARE_METATYPE(QImage *)

@@ -37,14 +37,20 @@ struct VidcoreParameters
 
 struct VidcoreExport;
 
-// The operations of an encoder object, in this order.
+// The operations of an encoder object, in this order. The film grows in a file of
+// its own and takes the place of the file named at open only when finish() has
+// completed it; whatever fails, nothing else on disk is touched.
 struct VidcoreOperations
 {
     bool (*open)(VidcoreExport *self, const wchar_t *fileName, VidcoreParameters *parameters);
-    void (*writeFrame)(VidcoreExport *self, const uint8_t *pixels, uint32_t byteCount, uint32_t timestamp);
-    void (*finish)(VidcoreExport *self);
+    // False once anything of the film could not be written (a full disk, a size limit).
+    bool (*writeFrame)(VidcoreExport *self, const uint8_t *pixels, uint32_t byteCount, uint32_t timestamp);
+    // True when the film is complete and in place.
+    bool (*finish)(VidcoreExport *self);
     void (*close)(VidcoreExport *self);
     void (*getParameters)(VidcoreExport *self, VidcoreParameters *parameters);
+    // UTF-8 text of the first failure, empty while all went well; valid until the next call.
+    const char *(*errorText)(VidcoreExport *self);
 };
 
 struct VidcoreExport

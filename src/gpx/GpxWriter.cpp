@@ -2,24 +2,23 @@
 
 #include "app/Trace.h"
 #include "path/Path.h"
+#include "platform/AtomicFileWriter.h"
 #include "project/ValueParsers.h"
 
-#include <QFile>
 #include <QXmlStreamWriter>
 
-
-bool GpxWriter::write(const QString &fileName, const std::vector<CurvePoint> &samples, const Path &path)
+bool GpxWriter::write(const QString &fileName, const std::vector<CurvePoint> &samples, const Path &path,
+                      QString *error)
 {
-    // A file marked read-only is left alone, even where the folder would allow removing it.
-    if (QFile::exists(fileName)
-        && (!(QFile::permissions(fileName) & QFileDevice::WriteOwner) || !QFile::remove(fileName)))
-        return false;
-    QFile file(fileName);
-    if (!file.open(QIODevice::WriteOnly | QIODevice::Text)) {
+    // The previous file is replaced only by a complete new one.
+    AtomicFileWriter file(fileName);
+    if (!file.open()) {
         logTrace(0, QStringLiteral("File open error: %s"), file.errorString());
+        if (error)
+            *error = file.errorString();
         return false;
     }
-    QXmlStreamWriter xml(&file);
+    QXmlStreamWriter xml(&file.device());
     xml.setAutoFormatting(true);
     xml.setCodec("UTF-8");
     xml.writeStartDocument(QStringLiteral("1.0"));
@@ -56,6 +55,13 @@ bool GpxWriter::write(const QString &fileName, const std::vector<CurvePoint> &sa
     xml.writeEndElement();
     xml.writeEndElement();
     xml.writeEndDocument();
-    file.close();
+    if (xml.hasError())
+        file.fail();
+    if (!file.commit()) {
+        logTrace(3, QStringLiteral("GpxWriter::write[%s] - not written, the previous file stays: %s"), fileName, file.errorString());
+        if (error)
+            *error = file.errorString();
+        return false;
+    }
     return true;
 }

@@ -14,6 +14,8 @@ class GpxWriter
 {
 public:
     // `samples` are the route's samples in order; `path` gives the bounds and the
-    // key points' titles. False when the file can't be replaced or opened.
-    static bool write(const QString &fileName, const std::vector<CurvePoint> &samples, const Path &path);
+    // key points' titles. The file is replaced only by a complete new one: false,
+    // with the reason in `error`, when it could not be written whole.
+    static bool write(const QString &fileName, const std::vector<CurvePoint> &samples, const Path &path,
+                      QString *error = nullptr);
 };

@@ -1,7 +1,7 @@
 #include "models/AltitudePreset.h"
 
 #include "app/Trace.h"
-#include "project/ProjectController.h"
+#include "project/QProjectController.h"
 #include "project/ValueParsers.h"
 
 #include <variant>
@@ -191,7 +191,7 @@ bool loadAltitudePreset(ProjectController &store, const QString &fileName, const
     return true;
 }
 
-bool saveAltitudePreset(ProjectController &store, const QString &fileName, const QString &prefix, const AltitudePreset &preset)
+bool saveAltitudePreset(QProjectController &store, const QString &fileName, const QString &prefix, const AltitudePreset &preset)
 {
     const bool opened = fileName.contains(QLatin1String(".zkgeo")) ? store.openProjectFile(fileName, false)
                                                                     : store.createProjectFile(fileName);
@@ -199,7 +199,7 @@ bool saveAltitudePreset(ProjectController &store, const QString &fileName, const
         return false;
     const bool written = writeAltitudePreset(store, prefix, preset);
     store.closeProjectFile();
-    return written;
+    return written && !store.lastWriteFailed();
 }
 
 bool writeAltitudePreset(ProjectController &store, const QString &prefix, const AltitudePreset &preset)

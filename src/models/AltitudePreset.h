@@ -6,6 +6,7 @@
 #include <cstdint>
 
 class ProjectController;
+class QProjectController;
 
 // The look of the altitude profile board. Stored as a ".tmprs" file of its own
 // (empty prefix) or inside a project under sections that start with "altprs.".
@@ -75,7 +76,8 @@ bool loadAltitudePreset(ProjectController &store, const QString &fileName, const
 
 // Writes the preset under `prefix`. A project file (".zkgeo" in the name) is
 // opened for adding, so that it keeps its content; any other file is created anew.
-bool saveAltitudePreset(ProjectController &store, const QString &fileName, const QString &prefix, const AltitudePreset &preset);
+// False when the file could not be written whole; it then stays as it was.
+bool saveAltitudePreset(QProjectController &store, const QString &fileName, const QString &prefix, const AltitudePreset &preset);
 
 // The keys of the preset under `prefix`, into a container already open for writing.
 bool writeAltitudePreset(ProjectController &store, const QString &prefix, const AltitudePreset &preset);

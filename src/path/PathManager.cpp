@@ -125,6 +125,19 @@ std::shared_ptr<const std::vector<CurvePoint>> PathManager::curvePointsVector() 
     return std::make_shared<const std::vector<CurvePoint>>(curvePoints());
 }
 
+std::vector<CurvePoint> PathManager::routeSamples() const
+{
+    std::vector<CurvePoint> samples;
+    const Path *path = active();
+    const int count = path ? path->curvePointCountBetween(0.0, 1.0) : -1;
+    if (count <= 0)
+        return samples;
+    samples.reserve(size_t(count));
+    for (int i = 0; i < count; ++i)
+        samples.push_back(path->curvePoints[size_t(i)]);
+    return samples;
+}
+
 bool PathManager::lastKeyPoint(KeyPoint &out) const
 {
     const Path *path = active();

@@ -34,6 +34,9 @@ public:
     std::vector<MediaPoint> mediaPoints() const;
     std::vector<CurvePoint> curvePoints() const;
     std::shared_ptr<const std::vector<CurvePoint>> curvePointsVector() const;
+    // The samples of the whole route, positions 0.0 to 1.0 in order, as they stand in
+    // the path: what the GPX export writes. Empty without a path or samples.
+    std::vector<CurvePoint> routeSamples() const;
     bool lastKeyPoint(KeyPoint &out) const;
 
     MediaPoint *mediaPointById(uint32_t id);

@@ -1,6 +1,5 @@
 #include "project/DocumentFile.h"
 
-#include "project/BackupSave.h"
 #include "project/PainterPathRenderer_Controller.h"
 #include "project/TrackOpening.h"
 
@@ -66,7 +65,5 @@ DocumentOpenResult openDocumentFile(PainterPathRenderer_Controller &document, co
 
 bool saveDocumentFile(PainterPathRenderer_Controller &document, const QString &fileName)
 {
-    return saveWithBackup(fileName, [&] {
-        return document.SaveProjectWithTheme(fileName) && !document.projectController().lastWriteFailed();
-    });
+    return document.SaveProjectWithTheme(fileName) && !document.projectController().lastWriteFailed();
 }

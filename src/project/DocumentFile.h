@@ -22,5 +22,6 @@ struct DocumentOpenResult
 DocumentOpenResult openDocumentFile(PainterPathRenderer_Controller &document, const QString &fileName);
 
 // Saves the document and its altitude theme (prefix "altprs.") into one project
-// file, keeping the previous file as ".bak" until the new one is complete.
+// file. False when the file could not be written whole; the previous file then
+// stays as it was, and the container's lastWriteError() tells why.
 bool saveDocumentFile(PainterPathRenderer_Controller &document, const QString &fileName);

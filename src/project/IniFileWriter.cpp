@@ -1,10 +1,12 @@
 #include "project/IniFileWriter.h"
 
+#include "platform/AtomicFileWriter.h"
+
 #include <QBuffer>
 #include <QHash>
-#include <QSaveFile>
 
 #include <algorithm>
+#include <cerrno>
 #include <cstring>
 
 namespace {
@@ -360,17 +362,16 @@ QByteArray IniFileWriter::toBytes() const
     return bytes;
 }
 
-bool IniFileWriter::save(const QString &fileName) const
+bool IniFileWriter::writeInto(AtomicFileWriter &file) const
 {
-    if (m_failed)
-        return false;
-    QSaveFile file(fileName);
-    if (!file.open(QIODevice::WriteOnly))
-        return false;
-    if (!writeTo(file)) {
-        file.cancelWriting();
-        file.commit();
+    if (m_failed) {
+        file.fail(QStringLiteral("not enough memory for the content"));
         return false;
     }
-    return file.commit();
+    errno = 0; // what the failed write leaves there is the reason
+    if (!writeTo(file.device())) {
+        file.fail();
+        return false;
+    }
+    return true;
 }

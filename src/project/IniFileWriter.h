@@ -10,6 +10,8 @@
 #include <string>
 #include <vector>
 
+class AtomicFileWriter;
+
 // Collects "section/key" values and writes them as the settings ini format writes a
 // new file: sections and keys in sorted order, keys and values escaped the same way,
 // so the bytes are those of QSettings::IniFormat, without its cost per value.
@@ -21,8 +23,9 @@ public:
 
     QByteArray toBytes() const;
     bool writeTo(QIODevice &device) const;
-    // Writes all at once through a temporary file; false when it isn't complete.
-    bool save(const QString &fileName) const;
+    // Everything into the file, which is left to commit; false, and the file
+    // marked as failed, when the content isn't complete.
+    bool writeInto(AtomicFileWriter &file) const;
 
     // The escapes of the format, for keys (and section names) and for values.
     static void escapeKey(const QString &key, std::string &out);

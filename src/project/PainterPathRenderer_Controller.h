@@ -29,8 +29,9 @@ public:
     // "newProject", an empty photo pool and active theme, key points not fixed.
     void newProject();
 
-    // Creates the file anew and writes the document; false when the file could not
-    // be created. The container is closed in every case.
+    // Writes the document into the file, which is replaced whole at the close; false
+    // when the container refused to start. Whether the file reached the disk tells
+    // the container's lastWriteFailed(). The container is closed in every case.
     bool SaveProject(const QString &fileName);
     // SaveProject, then the active theme with the prefix "altprs." into the same
     // file, as saveAltitudePreset adds it, but in one writing of the file: the bytes

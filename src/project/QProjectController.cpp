@@ -35,7 +35,31 @@ QString address(const QString &section, const QString &key)
 {
     return QStringLiteral("%1/%2").arg(section, key);
 }
+
+// A value of the store as the text the container hands out.
+QString storedText(const QVariant &value)
+{
+    // A hand-edited line with unquoted commas reads as a list; keep its text.
+    if (value.type() == QVariant::StringList)
+        return value.toStringList().join(QLatin1Char(','));
+    return value.toString();
 }
+
+// Every value of an existing file, as the container reads it, into `content`.
+// False when the file can't be read whole: adding to it would lose the rest.
+bool copyStoredValues(const QString &fileName, IniFileWriter &content)
+{
+    if (!QFileInfo(fileName).isReadable())
+        return false;
+    const QSettings stored(fileName, QSettings::IniFormat);
+    if (stored.status() != QSettings::NoError)
+        return false;
+    for (const QString &key : stored.allKeys())
+        content.setValue(QString(), key, storedText(stored.value(key)));
+    return true;
+}
+
+} // namespace
 
 QProjectController::QProjectController() = default;
 
@@ -44,12 +68,26 @@ QProjectController::~QProjectController()
     closeProjectFile();
 }
 
-void QProjectController::startWriter(const QString &fileName)
+void QProjectController::writeFailed(const QString &reason)
 {
-    m_writer = std::make_unique<QSettings>(fileName, QSettings::IniFormat);
-    m_writer->setValue(QStringLiteral("Header/projecttype"), QString::fromLatin1(ProjectFormat::projectIdentifier));
-    m_writer->setValue(QStringLiteral("Header/projectversion"), ProjectFormat::currentVersion);
-    m_writer->sync();
+    m_writeFailed = true;
+    if (m_writeError.isEmpty())
+        m_writeError = reason;
+}
+
+bool QProjectController::startWriting(const QString &fileName, std::unique_ptr<IniFileWriter> content)
+{
+    auto target = std::make_unique<AtomicFileWriter>(fileName);
+    if (!target->open()) {
+        writeFailed(target->errorString());
+        return false;
+    }
+    content->setValue(QStringLiteral("Header"), QStringLiteral("projecttype"), QString::fromLatin1(ProjectFormat::projectIdentifier));
+    content->setValue(QStringLiteral("Header"), QStringLiteral("projectversion"), QString::number(ProjectFormat::currentVersion));
+    m_content = std::move(content);
+    m_target = std::move(target);
+    m_fileName = fileName;
+    return true;
 }
 
 bool QProjectController::createProjectFile(QString fileName)
@@ -59,26 +97,31 @@ bool QProjectController::createProjectFile(QString fileName)
         return false;
     }
     m_writeFailed = false;
+    m_writeError.clear();
     forgetReadFile();
-    // The old file goes before the new one is written: callers that must not
-    // lose it keep their own copy first.
-    if (QFile::exists(fileName))
-        QFile::remove(fileName);
-    {
-        QFile file(fileName);
-        if (file.open(QIODevice::WriteOnly))
-            file.close();
-    }
-    if (!QFile::exists(fileName)) {
+    // The file that stands there now is replaced only by a complete new one, at the close.
+    if (!startWriting(fileName, std::make_unique<IniFileWriter>())) {
         logTrace(3, QStringLiteral("QProjectController::createProjectFile: can't create file %s"), fileName);
+        logTrace(3, QStringLiteral("QProjectController::createProjectFile[%s] - %s"), fileName, m_writeError);
         m_fileName.clear();
-        m_writeFailed = true;
         return true;
     }
-    m_newFile = std::make_unique<IniFileWriter>();
-    m_newFile->setValue(QStringLiteral("Header"), QStringLiteral("projecttype"), QString::fromLatin1(ProjectFormat::projectIdentifier));
-    m_newFile->setValue(QStringLiteral("Header"), QStringLiteral("projectversion"), QString::number(ProjectFormat::currentVersion));
-    m_fileName = fileName;
+    return true;
+}
+
+bool QProjectController::openForAdding(const QString &fileName)
+{
+    forgetReadFile();
+    auto content = std::make_unique<IniFileWriter>();
+    if (QFileInfo(fileName).isFile() && !copyStoredValues(fileName, *content)) {
+        writeFailed(QStringLiteral("the file can't be read"));
+        logTrace(3, QStringLiteral("QProjectController::openProjectFile[%s] - the file can't be read, nothing is added"), fileName);
+        return false;
+    }
+    if (!startWriting(fileName, std::move(content))) {
+        logTrace(3, QStringLiteral("QProjectController::openProjectFile[%s] - can't write: %s"), fileName, m_writeError);
+        return false;
+    }
     return true;
 }
 
@@ -89,12 +132,9 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
         return false;
     }
     m_writeFailed = false;
-    if (!forLoad) {
-        forgetReadFile();
-        m_fileName = fileName;
-        startWriter(fileName);
-        return true;
-    }
+    m_writeError.clear();
+    if (!forLoad)
+        return openForAdding(fileName);
     if (!QFile::exists(fileName)) {
         logTrace(3, QStringLiteral("QProjectController::openProjectFile for load: file %s doesn't exist"), fileName);
         return false;
@@ -134,16 +174,12 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
 
 bool QProjectController::writeProperty(QString section, QString key, QString value)
 {
-    if (m_newFile) {
-        m_newFile->setValue(section, key, value);
-        return true;
-    }
-    if (!m_writer) {
+    if (!m_content) {
         logTrace(3, QStringLiteral("QProjectController::writeProperty[%s]: writer object doesn't exist"), m_fileName);
-        m_writeFailed = true;
+        writeFailed(QStringLiteral("nothing is open for writing"));
         return false;
     }
-    m_writer->setValue(address(section, key), value);
+    m_content->setValue(section, key, value);
     return true;
 }
 
@@ -172,33 +208,20 @@ QString QProjectController::readProperty(QString section, QString key, QString d
 QString QProjectController::storeValue(const QString &address, const QString &defaultValue)
 {
     const QVariant value = m_reader->value(address);
-    if (!value.isValid())
-        return defaultValue;
-    // A hand-edited line with unquoted commas reads as a list; keep its text.
-    if (value.type() == QVariant::StringList)
-        return value.toStringList().join(QLatin1Char(','));
-    return value.toString();
+    return value.isValid() ? storedText(value) : defaultValue;
 }
 
 bool QProjectController::closeProjectFile()
 {
-    if (m_newFile) {
-        if (!m_newFile->save(m_fileName)) {
-            logTrace(3, QStringLiteral("QProjectController::closeProjectFile[%s] - the file could not be written"), m_fileName);
-            m_writeFailed = true;
+    if (m_content) {
+        if (!m_content->writeInto(*m_target) || !m_target->commit()) {
+            logTrace(3, QStringLiteral("QProjectController::closeProjectFile[%s] - the file could not be written, the previous one stays: %s"),
+                     m_fileName, m_target->errorString());
+            writeFailed(m_target->errorString());
         }
-        m_newFile.reset();
+        m_content.reset();
+        m_target.reset();
     }
-    // The writer is synced before it goes, so the next open in the same turn
-    // sees the whole file.
-    if (m_writer) {
-        m_writer->sync();
-        if (m_writer->status() != QSettings::NoError) {
-            logTrace(3, QStringLiteral("QProjectController::closeProjectFile[%s] - the file could not be written"), m_fileName);
-            m_writeFailed = true;
-        }
-    }
-    m_writer.reset();
     m_reader.reset();
     if (m_plainFile)
         m_lastRead.reader = std::move(m_plainFile);

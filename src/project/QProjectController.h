@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/AtomicFileWriter.h"
 #include "project/IniFileReader.h"
 #include "project/IniFileWriter.h"
 #include "project/ProjectController.h"
@@ -9,10 +10,14 @@
 class QSettings;
 
 // The ini container used by projects and altitude presets: one writer or one
-// reader at a time, in the format of QSettings::IniFormat. A new file is written
-// and a plain file read by our own code, which gives the same bytes and values at
-// a fraction of the cost; adding to an existing file and reading anything unusual
-// go through QSettings itself.
+// reader at a time, in the format of QSettings::IniFormat. Files are written by our
+// own code, which gives the bytes of the store at a fraction of the cost, and a
+// plain file is read by it too; anything unusual is read through QSettings itself.
+//
+// Nothing reaches the disk before the close: the whole content then goes into a
+// temporary file that replaces the file in one rename, so a write that fails on the
+// way leaves the previous file exactly as it was. Adding to an existing file reads
+// its values first and writes them back with the new ones.
 class QProjectController : public ProjectController
 {
 public:
@@ -26,7 +31,7 @@ public:
     bool closeProjectFile() override;
 
     bool isIdle() const { return !isWriting() && !isReading(); }
-    bool isWriting() const { return m_writer != nullptr || m_newFile != nullptr; }
+    bool isWriting() const { return m_content != nullptr; }
     bool isReading() const { return m_reader != nullptr || m_plainFile != nullptr; }
 
     // A file read is kept after its close, so that reading the same unchanged file
@@ -35,17 +40,20 @@ public:
     void forgetReadFile();
 
     // Whether anything of the last write went wrong: no file could be made, a
-    // property met no writer, or the store could not put the file on disk.
-    // Cleared by the next create or open.
+    // property met no writer, or the file could not be put on disk. Cleared by the
+    // next create or open. lastWriteError() tells why.
     bool lastWriteFailed() const { return m_writeFailed; }
+    QString lastWriteError() const { return m_writeError; }
 
 private:
-    void startWriter(const QString &fileName);
+    bool startWriting(const QString &fileName, std::unique_ptr<IniFileWriter> content);
+    bool openForAdding(const QString &fileName);
+    void writeFailed(const QString &reason);
     QString storeValue(const QString &address, const QString &defaultValue);
 
-    std::unique_ptr<QSettings> m_writer;
     std::unique_ptr<QSettings> m_reader;
-    std::unique_ptr<IniFileWriter> m_newFile;
+    std::unique_ptr<IniFileWriter> m_content;
+    std::unique_ptr<AtomicFileWriter> m_target;
     std::unique_ptr<IniFileReader> m_plainFile;
     struct ReadFile
     {
@@ -56,4 +64,5 @@ private:
     };
     ReadFile m_lastRead;
     bool m_writeFailed = false;
+    QString m_writeError;
 };

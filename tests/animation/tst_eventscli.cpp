@@ -1,4 +1,5 @@
 #include "CliRun.h"
+#include "app/AppSettings.h"
 #include "path/PathManager.h"
 #include "project/DocumentFile.h"
 #include "project/PainterPathRenderer_Controller.h"
@@ -7,6 +8,7 @@
 #include <QJsonDocument>
 #include <QJsonObject>
 #include <QSet>
+#include <QSettings>
 #include <QTemporaryDir>
 #include <QTest>
 
@@ -49,6 +51,9 @@ private:
 private slots:
     void initTestCase()
     {
+        // The user's settings, which the command reads, are this test's own.
+        qputenv("XDG_CONFIG_HOME", QFile::encodeName(m_dir.filePath(QStringLiteral("config"))));
+
         // Three key points; legs of 3 and 6 seconds, so that the timeline at the
         // default factor is the natural 270 frames and the legs differ.
         PainterPathRenderer_Controller document;
@@ -146,6 +151,40 @@ private slots:
         QCOMPARE(events[180].value(QStringLiteral("type")).toString(), QStringLiteral("pause"));
     }
 
+    // The longest film is the stored choice unless the option overrides it; at five
+    // minutes the timeline is 15 times the natural 270 frames, at one minute 1800.
+    void longestFilm_data()
+    {
+        QTest::addColumn<QString>("stored");
+        QTest::addColumn<QString>("option");
+        QTest::addColumn<int>("totalFrames");
+        QTest::newRow("nothing stored") << QString() << QString() << 4050;
+        QTest::newRow("stored 1 min") << "0" << QString() << 1800;
+        QTest::newRow("option over stored") << "0" << "3" << 4050;
+        QTest::newRow("option 1 min") << QString() << "0" << 1800;
+    }
+
+    void longestFilm()
+    {
+        QFETCH(QString, stored);
+        QFETCH(QString, option);
+        QFETCH(int, totalFrames);
+        {
+            QSettings store(QSettings::NativeFormat, QSettings::UserScope, SettingsOrganisation, SettingsApplication);
+            QVERIFY(store.fileName().startsWith(m_dir.path()));
+            if (stored.isEmpty())
+                store.remove(SettingsKey::MaxAnimationDuration);
+            else
+                AppSettings(store).setMaxAnimationDuration(stored.toInt());
+        }
+        QStringList args = {QStringLiteral("events"), m_project, QStringLiteral("--summary")};
+        if (!option.isEmpty())
+            args << QStringLiteral("--max-duration") << option;
+        const CliRun run = runCli(args);
+        QCOMPARE(run.exitCode, 0);
+        QCOMPARE(QJsonDocument::fromJson(run.out).object().value(QStringLiteral("totalFrames")).toInt(), totalFrames);
+    }
+
     void badInput()
     {
         CliRun run = runCli({QStringLiteral("events"), m_dir.filePath(QStringLiteral("missing.zkgeo"))});
@@ -157,6 +196,9 @@ private slots:
         QVERIFY(run.exitCode != 0);
         QVERIFY(run.err.contains("--linear"));
         run = runCli({QStringLiteral("events"), m_project, QStringLiteral("--flyin")});
+        QVERIFY(run.exitCode != 0);
+        run = runCli({QStringLiteral("events"), m_project, QStringLiteral("--max-duration"), QStringLiteral("5")});
+        QVERIFY(run.err.contains("--max-duration"));
         QVERIFY(run.exitCode != 0);
         run = runCli({QStringLiteral("events")});
         QVERIFY(run.exitCode != 0);

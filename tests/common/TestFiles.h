@@ -1,7 +1,10 @@
 #pragma once
 
 #include <QByteArray>
+#include <QDir>
+#include <QDirIterator>
 #include <QFile>
+#include <QMap>
 #include <QString>
 #include <QTemporaryDir>
 
@@ -14,4 +17,29 @@ inline QString writeTestFile(const QTemporaryDir &dir, const QString &name, cons
     if (!f.open(QIODevice::WriteOnly) || f.write(bytes) != bytes.size())
         qFatal("cannot write test file %s", qPrintable(file));
     return file;
+}
+
+// Everything under a folder, by relative path: links with what they name, folders,
+// and files with their permissions and bytes. Two equal snapshots mean nothing in
+// the folder was touched.
+inline QMap<QString, QByteArray> folderSnapshot(const QString &folder)
+{
+    QMap<QString, QByteArray> entries;
+    QDirIterator it(folder, QDir::AllEntries | QDir::NoDotAndDotDot | QDir::Hidden | QDir::System,
+                    QDirIterator::Subdirectories);
+    while (it.hasNext()) {
+        const QString name = it.next();
+        const QFileInfo info = it.fileInfo();
+        QByteArray entry = QByteArray::number(int(info.permissions()), 16);
+        if (info.isSymLink()) {
+            entry += " -> " + QFile::encodeName(info.symLinkTarget());
+        } else if (info.isDir()) {
+            entry += '/';
+        } else {
+            QFile file(name);
+            entry += ':' + (file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("unreadable"));
+        }
+        entries.insert(QDir(folder).relativeFilePath(name), entry);
+    }
+    return entries;
 }

@@ -1,3 +1,5 @@
+#include "CliRun.h"
+#include "TestFiles.h"
 #include "export/EncoderLibrary.h"
 #include "export/ExportWorker.h"
 #include "export/QGrabWidgetFrame.h"
@@ -10,6 +12,7 @@
 #include <QJsonDocument>
 #include <QJsonObject>
 #include <QPainter>
+#include <QRandomGenerator>
 #include <QProcess>
 #include <QRegularExpression>
 #include <QSignalSpy>
@@ -18,8 +21,13 @@
 #include <QThread>
 
 #include <cmath>
+#include <csignal>
 #include <functional>
 #include <string>
+
+#include <sys/resource.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 namespace {
 
@@ -278,7 +286,7 @@ private slots:
         QCOMPARE(p.frameRate, QStringLiteral("30/1"));
         if (mp4)
             QVERIFY(topLevelBoxes(file).indexOf(QStringLiteral("moov")) < topLevelBoxes(file).indexOf(QStringLiteral("mdat")));
-        QVERIFY(!QFile::exists(file + QStringLiteral(".comment.tmp")));
+        QCOMPARE(QDir(m_dir.path()).entryList({QFileInfo(file).fileName() + QStringLiteral(".*")}), QStringList());
         // A second comment replaces the first.
         QVERIFY(VideoComment::write(file, VideoComment::text(QStringLiteral("7"))));
         QCOMPARE(probe(file).comment, QStringLiteral("ZkTourlet|Frame=7"));
@@ -375,6 +383,7 @@ private slots:
             fill(0, frame);
             worker.exportNextFrame(0, &frame);
         }
+        QVERIFY(!QFile::exists(file)); // an unfinished film is dropped
         QVERIFY(!EncoderLibrary::isLoaded());
         QVERIFY(!EncoderLibrary::owner());
         const QString next = path(QStringLiteral("after.mp4"));
@@ -421,6 +430,95 @@ private slots:
         QVERIFY(!VideoComment::write(text, QStringLiteral("x")));
         QVERIFY(f.open(QIODevice::ReadOnly));
         QCOMPARE(f.readAll(), QByteArray("not a film"));
+    }
+
+    // The worker tells at once when the film can't be written, and the place named at
+    // the start stays as it was. Run in a child process under a file size limit.
+    void workerReportsALostFilm()
+    {
+        const QString file = path(QStringLiteral("lost.mp4"));
+        const pid_t child = fork();
+        QVERIFY(child >= 0);
+        if (child == 0) {
+            std::signal(SIGXFSZ, SIG_IGN);
+            const rlimit small{16 * 1024, 16 * 1024};
+            setrlimit(RLIMIT_FSIZE, &small);
+            ExportWorker worker;
+            QSignalSpy failed(&worker, &ExportWorker::exportFailed);
+            QSignalSpy finalized(&worker, &ExportWorker::finalized);
+            if (!worker.start(640, 360, 30.0, file, true))
+                _exit(2);
+            QImage frame(640, 360, QImage::Format_RGB32);
+            QRandomGenerator noise(3);
+            int frames = 0;
+            for (; frames < 300 && failed.isEmpty(); ++frames) {
+                noise.fillRange(reinterpret_cast<quint32 *>(frame.bits()), int(frame.sizeInBytes() / 4));
+                worker.exportNextFrame(frames, &frame);
+            }
+            worker.finalizeExport();
+            const bool told = failed.count() == 1 && frames < 300 && worker.hasFailed()
+                              && worker.errorString() == failed.first().first().toString()
+                              && worker.errorString().contains(file);
+            // Bits of the exit code: 1 no clear report, 2 no end, 4 something at the target.
+            _exit((told ? 0 : 1) | (finalized.count() == 1 ? 0 : 2) | (QFile::exists(file) ? 4 : 0));
+        }
+        int status = 0;
+        QCOMPARE(waitpid(child, &status, 0), child);
+        QVERIFY(WIFEXITED(status));
+        QCOMPARE(WEXITSTATUS(status), 0);
+    }
+
+    // An encode that fails exits with one line and changes nothing at its target, be
+    // it a file, a link or a folder; one that works writes through a link.
+    void encodeTouchesOnlyAFinishedFilm_data()
+    {
+        QTest::addColumn<QString>("format");
+        QTest::addColumn<QString>("target");
+        QTest::addColumn<bool>("limited");
+        QTest::addColumn<int>("exitCode");
+        QTest::newRow("mp4 over a file, size limit") << "mp4" << "file" << true << 1;
+        QTest::newRow("wmv, size limit") << "wmv" << "none" << true << 1;
+        QTest::newRow("mp4 through a link, size limit") << "mp4" << "link" << true << 1;
+        QTest::newRow("mp4 through a dangling link") << "mp4" << "dangling link" << false << 1;
+        QTest::newRow("wmv onto a folder") << "wmv" << "folder" << false << 1;
+        QTest::newRow("mp4 through a link") << "mp4" << "link" << false << 0;
+    }
+
+    void encodeTouchesOnlyAFinishedFilm()
+    {
+        QFETCH(QString, format);
+        QFETCH(QString, target);
+        QFETCH(bool, limited);
+        QFETCH(int, exitCode);
+        QTemporaryDir dir;
+        const QString out = dir.filePath(QStringLiteral("out.") + format);
+        const QString film = dir.filePath(QStringLiteral("earlier film"));
+        writeTestFile(dir, QStringLiteral("earlier film"), "an earlier film");
+        if (target == QLatin1String("file"))
+            writeTestFile(dir, QStringLiteral("out.") + format, "the previous file");
+        else if (target == QLatin1String("link"))
+            QVERIFY(QFile::link(film, out));
+        else if (target == QLatin1String("dangling link"))
+            QVERIFY(QFile::link(dir.filePath(QStringLiteral("gone/film.mp4")), out));
+        else if (target == QLatin1String("folder"))
+            QVERIFY(QDir().mkpath(out + QStringLiteral("/inside")));
+
+        const QMap<QString, QByteArray> before = folderSnapshot(dir.path());
+        const QStringList args = {QStringLiteral("encode"), QStringLiteral("--frames"), QStringLiteral("90"),
+                                  QStringLiteral("--size"), QStringLiteral("640x360"), QStringLiteral("--format"),
+                                  format, QStringLiteral("-o"), out};
+        const CliRun run = limited ? runCliWithFileSizeLimit(64, args) : runCli(args);
+        QCOMPARE(run.exitCode, exitCode);
+        const QMap<QString, QByteArray> after = folderSnapshot(dir.path());
+        if (exitCode != 0) {
+            QCOMPARE(run.err.count('\n'), 1);
+            QVERIFY2(run.err.contains(QFile::encodeName(QFileInfo(out).fileName())), run.err.constData());
+            QCOMPARE(after, before);
+            return;
+        }
+        QCOMPARE(after.keys(), before.keys());
+        QVERIFY(QFileInfo(out).isSymLink());
+        QCOMPARE(probe(out).frames, 90);
     }
 
     void libraryRefusesBadInput()

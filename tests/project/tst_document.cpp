@@ -1,4 +1,5 @@
-#include "project/BackupSave.h"
+#include "TestFiles.h"
+#include "gpx/GpxWriter.h"
 #include "project/DocumentFile.h"
 #include "project/PainterPathRenderer_Controller.h"
 #include "project/ValueParsers.h"
@@ -11,7 +12,12 @@
 #include <QTest>
 
 #include <csignal>
+#include <functional>
+#include <grp.h>
+#include <pwd.h>
 #include <sys/resource.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 namespace {
 
@@ -127,6 +133,41 @@ double six(double v)
     return std::round(v * 1e6) / 1e6;
 }
 
+enum class Hindrance { None, FileSizeLimit, ReadOnlyFolder, ReadOnlyFile, FolderInTheWay };
+enum class Writer { Project, Gpx, ThemeFile, ThemeIntoProject };
+
+uid_t nobody()
+{
+    const passwd *entry = getpwnam("nobody");
+    return entry ? entry->pw_uid : 65534;
+}
+
+// Runs `write` in a child process, under a small file size limit or, for a read-only
+// folder, without the rights of root, which ignore folder permissions. The exit
+// code: 0 written, 1 refused, anything else a broken run.
+int writeInChild(const std::function<bool()> &write, Hindrance hindrance)
+{
+    const pid_t child = fork();
+    if (child < 0)
+        return -1;
+    if (child == 0) {
+        if (hindrance == Hindrance::FileSizeLimit) {
+            std::signal(SIGXFSZ, SIG_IGN);
+            const rlimit small{200, 200};
+            if (setrlimit(RLIMIT_FSIZE, &small) != 0)
+                _exit(3);
+        }
+        if (hindrance == Hindrance::ReadOnlyFolder && geteuid() == 0
+            && (setgroups(0, nullptr) != 0 || setgid(nobody()) != 0 || setuid(nobody()) != 0))
+            _exit(3);
+        _exit(write() ? 0 : 1);
+    }
+    int status = 0;
+    if (waitpid(child, &status, 0) != child || !WIFEXITED(status))
+        return -1;
+    return WEXITSTATUS(status);
+}
+
 } // namespace
 
 class TestDocument : public QObject
@@ -188,7 +229,6 @@ private slots:
         fillDocument(doc, picture);
         const QString file = path(QStringLiteral("round trip.zkgeo"));
         QVERIFY(saveDocumentFile(doc, file));
-        QVERIFY(!QFile::exists(backupFileName(file)));
 
         PainterPathRenderer_Controller back;
         const DocumentOpenResult result = openDocumentFile(back, file);
@@ -566,70 +606,97 @@ private slots:
         QVERIFY(loaded > 0);
     }
 
-    void previousFileSurvivesAFailedSave()
+    // A write that can't be completed leaves everything in the folder as it was: the
+    // previous file byte for byte, a ".bak" beside it, and no file of its own.
+    void failedWriteLeavesThePreviousFile_data()
     {
+        QTest::addColumn<int>("writer");
+        QTest::addColumn<int>("hindrance");
+        QTest::addColumn<bool>("withBackup");
+        QTest::addColumn<bool>("written");
+        const std::pair<Writer, const char *> writers[] = {{Writer::Project, "project"},
+                                                            {Writer::Gpx, "gpx"},
+                                                            {Writer::ThemeFile, "theme file"},
+                                                            {Writer::ThemeIntoProject, "theme into project"}};
+        for (const auto &w : writers) {
+            const auto row = [&](const char *what, Hindrance h, bool backup, bool written) {
+                QTest::addRow("%s, %s", w.second, what) << int(w.first) << int(h) << backup << written;
+            };
+            row("written", Hindrance::None, true, true);
+            row("file size limit", Hindrance::FileSizeLimit, false, false);
+            row("file size limit, .bak", Hindrance::FileSizeLimit, true, false);
+            row("read-only folder, .bak", Hindrance::ReadOnlyFolder, true, false);
+            row("read-only file", Hindrance::ReadOnlyFile, false, false);
+            row("folder in the way", Hindrance::FolderInTheWay, false, false);
+        }
+    }
+
+    void failedWriteLeavesThePreviousFile()
+    {
+        QFETCH(int, writer);
+        QFETCH(int, hindrance);
+        QFETCH(bool, withBackup);
+        QFETCH(bool, written);
+        const Hindrance hinder = Hindrance(hindrance);
+
         QImage image(8, 8, QImage::Format_RGB32);
         image.fill(Qt::blue);
-        const QString picture = path(QStringLiteral("bak.png"));
+        const QString picture = path(QStringLiteral("writers.png"));
         QVERIFY(image.save(picture));
         PainterPathRenderer_Controller doc;
         fillDocument(doc, picture);
-        const QString file = path(QStringLiteral("precious.zkgeo"));
-        QVERIFY(saveDocumentFile(doc, file));
-        const QByteArray before = readBytes(file);
-        const QString backup = backupFileName(file);
+        Path &route = doc.pathManager().activeChecked();
 
-        // A file system that fills up in the middle of the write.
-        Path &track = doc.pathManager().activeChecked();
-        track.pathType = PathType::GPX;
-        for (int i = 0; i < 20000; ++i)
-            track.addCurvePoint(i * 1e-4, 45.0, 0);
-        std::signal(SIGXFSZ, SIG_IGN);
-        rlimit old{};
-        QCOMPARE(getrlimit(RLIMIT_FSIZE, &old), 0);
-        rlimit small = old;
-        small.rlim_cur = rlim_t(before.size()) + 4096;
-        QCOMPARE(setrlimit(RLIMIT_FSIZE, &small), 0);
-        const bool saved = saveDocumentFile(doc, file);
-        QCOMPARE(setrlimit(RLIMIT_FSIZE, &old), 0);
-        QVERIFY(!saved);
-        QVERIFY(QFile::exists(backup));
-        QCOMPARE(readBytes(backup), before);
-        QVERIFY(doc.projectController().isIdle());
+        const char *names[] = {"tour.zkgeo", "route.gpx", "board.tmprs", "tour.zkgeo"};
+        const QString folder = path(QString::fromLatin1(QTest::currentDataTag()));
+        QVERIFY(QDir().mkpath(folder));
+        const QString target = folder + QLatin1Char('/') + QLatin1String(names[writer]);
+        if (hinder == Hindrance::FolderInTheWay) {
+            QVERIFY(QDir().mkpath(target));
+            writeText(target + QStringLiteral("/inside"), "not to be moved");
+        } else {
+            writeText(target, (projectHeader() + QStringLiteral("[keep]\nme=yes\n")).toUtf8());
+        }
+        if (withBackup)
+            writeText(target + QStringLiteral(".bak"), "the user's own copy");
+        if (hinder == Hindrance::ReadOnlyFile)
+            QVERIFY(QFile::setPermissions(target, QFileDevice::ReadOwner | QFileDevice::ReadGroup));
+        if (hinder == Hindrance::ReadOnlyFolder) {
+            QVERIFY(QFile::setPermissions(m_dir.path(), QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner
+                                                             | QFileDevice::ReadOther | QFileDevice::ExeOther));
+            // The file itself stays writable for the writer: only the folder stops it.
+            if (geteuid() == 0)
+                QCOMPARE(chown(QFile::encodeName(target).constData(), nobody(), gid_t(-1)), 0);
+            QVERIFY(QFile::setPermissions(folder, QFileDevice::ReadOwner | QFileDevice::ExeOwner | QFileDevice::ReadOther
+                                                      | QFileDevice::ExeOther));
+        }
 
-        // The next save that works replaces the file and drops the copy; a backup
-        // already there is the last complete version and is not overwritten meanwhile.
-        QVERIFY(!saveWithBackup(file, [] { return false; }));
-        QCOMPARE(readBytes(backup), before);
-        QVERIFY(saveDocumentFile(doc, file));
-        QVERIFY(!QFile::exists(backup));
-        QVERIFY(readBytes(file).size() > before.size());
-
-        // A write that fails by itself keeps the fresh copy.
-        const QByteArray good = readBytes(file);
-        QVERIFY(!saveWithBackup(file, [&] {
-            writeText(file, "half");
+        const std::function<bool()> write = [&] {
+            switch (Writer(writer)) {
+            case Writer::Project:
+                return saveDocumentFile(doc, target);
+            case Writer::Gpx:
+                return GpxWriter::write(target, route.curvePoints, route);
+            case Writer::ThemeFile:
+                return saveAltitudePreset(doc.projectController(), target, QString(), doc.altitudePreset());
+            case Writer::ThemeIntoProject:
+                return saveAltitudePreset(doc.projectController(), target, altitudePresetPrefix(), doc.altitudePreset());
+            }
             return false;
-        }));
-        QCOMPARE(readBytes(backup), good);
-        QFile::remove(backup);
+        };
+        const QMap<QString, QByteArray> before = folderSnapshot(folder);
+        const int result = writeInChild(write, hinder);
+        const QMap<QString, QByteArray> after = folderSnapshot(folder);
+        QFile::setPermissions(folder, QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner);
 
-        // A place where no file can be made: the container goes on as documented,
-        // the save as a whole reports the failure.
-        const QString nowhere = path(QStringLiteral("no such folder/x.zkgeo"));
-        QVERIFY(doc.SaveProject(nowhere));
-        QVERIFY(doc.projectController().lastWriteFailed());
-        QVERIFY(!saveDocumentFile(doc, nowhere));
-        QVERIFY(!QFile::exists(nowhere));
-
-        // No copy can be made: nothing is written.
-        const QString intoFolder = path(QStringLiteral("folder.zkgeo"));
-        writeText(intoFolder, "old");
-        QVERIFY(QDir().mkpath(backupFileName(intoFolder) + QStringLiteral("/x")));
-        bool called = false;
-        QVERIFY(!saveWithBackup(intoFolder, [&] { return called = true; }));
-        QVERIFY(!called);
-        QCOMPARE(readBytes(intoFolder), QByteArray("old"));
+        QCOMPARE(result, written ? 0 : 1);
+        QCOMPARE(after.keys(), before.keys());
+        for (const QString &name : before.keys()) {
+            if (written && folder + QLatin1Char('/') + name == target)
+                QVERIFY(after.value(name) != before.value(name));
+            else
+                QCOMPARE(after.value(name), before.value(name));
+        }
     }
 
 private:

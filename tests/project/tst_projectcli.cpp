@@ -1,4 +1,10 @@
 #include "CliRun.h"
+#include "TestFiles.h"
+#include "gpx/TrackFile.h"
+#include "project/DocumentFile.h"
+#include "project/PainterPathRenderer_Controller.h"
+
+#include <QDir>
 #include <QFile>
 #include <QJsonArray>
 #include <QJsonDocument>
@@ -16,6 +22,16 @@ void writeText(const QString &file, const QByteArray &text)
     QFile f(file);
     QVERIFY(f.open(QIODevice::WriteOnly));
     f.write(text);
+}
+
+// Positions in order, each run of equal positions taken once.
+std::vector<std::pair<double, double>> positions(const std::vector<std::pair<double, double>> &all)
+{
+    std::vector<std::pair<double, double>> distinct;
+    for (const auto &p : all)
+        if (distinct.empty() || distinct.back() != p)
+            distinct.push_back(p);
+    return distinct;
 }
 
 } // namespace
@@ -36,6 +52,8 @@ private slots:
                           "[animator]\nprojectTitle=Elbe\ncurvemode=1\npathtype=1\ncurrentZoomLevel=8.5\n"
                           "[keypoints]\nelements=2\n"
                           "[keypoint0]\nx=13.7\ny=51.05\nlongitude=13.7\nlatitude=51.05\nkppTitle=Dresden\nkppDurationToNextKP=4000\n"
+                          "family=Georgia\npointSize=24.5\nstyle=2\ncolor=#112233\nhasFrame=0\nhasShadow=1\nkppSize=1.5\n"
+                          "kppImageSource=/symbols/pin.png\n"
                           "[keypoint1]\nx=13.4\ny=52.5\nlongitude=13.4\nlatitude=52.5\nkppTitle=Berlin\n"
                           "[pathSegments]\nelements=2\n[pathsegment0]\npilot_width=77.5\n[pathsegment1]\npilot_source=/b.png\n"
                           "[photopool]\nsize=1\n[photopool_item0]\npath=/gone/p.jpg\ntime=2019:05:04 10:11:12\n");
@@ -60,6 +78,11 @@ private slots:
         const QJsonObject first = pathObject.value(QStringLiteral("keyPoints")).toArray().at(0).toObject();
         QCOMPARE(first.value(QStringLiteral("title")).toString(), QStringLiteral("Dresden"));
         QCOMPARE(first.value(QStringLiteral("durationToNextKP")).toInt(), 4000);
+        QCOMPARE(first.value(QStringLiteral("size")).toDouble(), 1.5);
+        QCOMPARE(first.value(QStringLiteral("imageSource")).toString(), QStringLiteral("/symbols/pin.png"));
+        QCOMPARE(first.value(QStringLiteral("font")).toObject(),
+                 (QJsonObject{{"family", "Georgia"}, {"pointSize", 24.5}, {"style", 2}, {"color", "#112233"},
+                              {"hasFrame", false}, {"hasShadow", true}}));
         const QJsonArray segments = pathObject.value(QStringLiteral("segments")).toArray();
         QCOMPARE(segments.at(0).toObject().value(QStringLiteral("pilot_width")).toDouble(), 77.5);
         QCOMPARE(segments.at(1).toObject().value(QStringLiteral("pilot_source")).toString(), QStringLiteral("/b.png"));
@@ -160,6 +183,98 @@ private slots:
         QCOMPARE(run.exitCode, 1);
         run = runCli({QStringLiteral("convert"), foreign});
         QCOMPARE(run.exitCode, 1);
+    }
+
+    void gpxOfAProjectReadsBackAsItsRoute()
+    {
+        PainterPathRenderer_Controller document;
+        document.newProject();
+        Path &route = document.pathManager().activeChecked();
+        route.addKeyPoint(13.70, 51.05, 0.0, QStringLiteral("Dresden"), false);
+        route.addKeyPoint(13.10, 51.60, 0.0, QStringLiteral("hidden"), false);
+        route.addKeyPoint(13.40, 52.50, 0.0, QStringLiteral("Berlin"), true);
+        route.keyPoints[0].properties.title = QStringLiteral("Dresden");
+        route.keyPoints[1].properties.title = QStringLiteral("hidden");
+        route.keyPoints[1].properties.enabled = false;
+        route.keyPoints[2].properties.title = QStringLiteral("Berlin");
+        const QString project = path("route.zkgeo");
+        QVERIFY(saveDocumentFile(document, project));
+
+        const QString gpx = path("route.gpx");
+        const CliRun run = runCli({QStringLiteral("gpx"), project, QStringLiteral("-o"), gpx});
+        QCOMPARE(run.exitCode, 0);
+        const QJsonObject result = QJsonDocument::fromJson(run.out).object();
+        QCOMPARE(result.value(QStringLiteral("kind")).toString(), QStringLiteral("project"));
+
+        // The route as the program opens the project, against what the GPX holds.
+        PainterPathRenderer_Controller opened;
+        QVERIFY(openDocumentFile(opened, project).ok());
+        const std::vector<CurvePoint> samples = opened.pathManager().routeSamples();
+        QVERIFY(samples.size() > 3);
+        QCOMPARE(result.value(QStringLiteral("samples")).toInt(), int(samples.size()));
+        TrackFile back;
+        QVERIFY(back.load(gpx));
+        QVERIFY(back.isOwnFile());
+        QCOMPARE(int(back.items().size()), 1);
+        std::vector<std::pair<double, double>> written, expected;
+        QStringList names;
+        for (const TrackPoint &p : back.items().front().points) {
+            written.emplace_back(p.longitude, p.latitude);
+            if (!p.name.isEmpty())
+                names << p.name;
+        }
+        for (const CurvePoint &c : samples)
+            expected.emplace_back(c.x, c.y);
+        QVERIFY(positions(written) == positions(expected));
+        QCOMPARE(names, (QStringList{QStringLiteral("Dresden"), QStringLiteral("Berlin")}));
+
+        const CliRun missing = runCli({QStringLiteral("gpx"), project});
+        QCOMPARE(missing.exitCode, 1);
+        QCOMPARE(missing.err.count('\n'), 1);
+    }
+
+    // A write that fails exits non-zero with one line and leaves the folder as it was.
+    void failedWritesChangeNothing_data()
+    {
+        QTest::addColumn<QString>("command");
+        QTest::addColumn<bool>("folderInTheWay");
+        QTest::newRow("convert, file size limit") << "convert" << false;
+        QTest::newRow("gpx, file size limit") << "gpx" << false;
+        QTest::newRow("track --write-gpx, file size limit") << "track" << false;
+        QTest::newRow("convert onto a folder") << "convert" << true;
+        QTest::newRow("gpx onto a folder") << "gpx" << true;
+    }
+
+    void failedWritesChangeNothing()
+    {
+        QFETCH(QString, command);
+        QFETCH(bool, folderInTheWay);
+        QTemporaryDir dir;
+        QByteArray track = "<?xml version=\"1.0\"?>\n<gpx creator=\"logger\"><trk><trkseg>\n";
+        for (int i = 0; i < 400; ++i)
+            track += "<trkpt lat=\"" + QByteArray::number(47.0 + i * 1e-3) + "\" lon=\"" + QByteArray::number(9.0 + i * 1e-3)
+                     + "\"/>\n";
+        track += "</trkseg></trk></gpx>\n";
+        const QString source = dir.filePath(QStringLiteral("ride.gpx"));
+        writeText(source, track);
+        const QString target = dir.filePath(QStringLiteral("out"));
+        if (folderInTheWay) {
+            QVERIFY(QDir().mkpath(target));
+            writeText(target + QStringLiteral("/inside"), "stays");
+        } else {
+            writeText(target, "the previous file");
+        }
+        const QStringList args = command == QLatin1String("track")
+            ? QStringList{command, source, QStringLiteral("--write-gpx"), target}
+            : QStringList{command, source, QStringLiteral("-o"), target};
+
+        const QMap<QString, QByteArray> before = folderSnapshot(dir.path());
+        const CliRun run = folderInTheWay ? runCli(args) : runCliWithFileSizeLimit(4, args);
+        QCOMPARE(run.exitCode, 1);
+        QCOMPARE(run.err.count('\n'), 1);
+        QVERIFY2(run.err.contains(QFile::encodeName(target)), run.err.constData());
+        QVERIFY(run.out.isEmpty());
+        QCOMPARE(folderSnapshot(dir.path()), before);
     }
 };
 

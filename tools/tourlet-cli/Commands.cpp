@@ -6,6 +6,7 @@ std::vector<CliCommand> allCommands()
     commands.push_back(curveCommand());
     commands.push_back(projectCommand());
     commands.push_back(convertCommand());
+    commands.push_back(gpxCommand());
     commands.push_back(trackCommand());
     commands.push_back(contentCommand());
     commands.push_back(encodeCommand());

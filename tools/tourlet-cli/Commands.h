@@ -10,6 +10,7 @@ std::vector<CliCommand> allCommands();
 CliCommand curveCommand();
 CliCommand projectCommand();
 CliCommand convertCommand();
+CliCommand gpxCommand();
 CliCommand trackCommand();
 CliCommand contentCommand();
 CliCommand encodeCommand();

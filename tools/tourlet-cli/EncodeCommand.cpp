@@ -3,6 +3,7 @@
 #include "export/EncoderLibrary.h"
 #include "export/ExportWorker.h"
 #include "export/VideoComment.h"
+#include "platform/AtomicFileWriter.h"
 
 #include <QDir>
 #include <QElapsedTimer>
@@ -122,6 +123,9 @@ public:
     }
 
 public slots:
+    // After a failure no more frames go out; the worker is finalized at once.
+    void stop() { m_frames = m_sent; }
+
     void next()
     {
         if (m_sent == m_frames) {
@@ -205,47 +209,50 @@ bool parseOptions(QStringList args, EncodeOptions &o, QString &error)
     return true;
 }
 
-// The synthetic frames as raw BGRX bytes, so that other encoders can be fed the same picture.
+// The synthetic frames as raw BGRX bytes, so that other encoders can be fed the same
+// picture. A file is replaced only when all frames are in it.
 int writeRawFrames(const EncodeOptions &o)
 {
-    QFile out;
-    const bool toStdout = o.output == QLatin1String("-");
-    const bool opened = toStdout ? out.open(stdout, QIODevice::WriteOnly) : (out.setFileName(o.output), out.open(QIODevice::WriteOnly));
-    if (!opened)
-        return cli::fail(QStringLiteral("cannot write %1: %2").arg(o.output, out.errorString()));
     SyntheticFrames source(o.size);
     QImage frame(o.size, QImage::Format_RGB32);
-    for (int i = 0; i < o.frames; ++i) {
-        source.draw(i, frame);
-        if (out.write(reinterpret_cast<const char *>(frame.constBits()), frame.sizeInBytes()) != frame.sizeInBytes()) {
-            if (!toStdout)
-                out.remove();
-            return cli::fail(QStringLiteral("cannot write %1: %2").arg(o.output, out.errorString()));
+    const auto nextFrame = [&](int index) {
+        source.draw(index, frame);
+        return QByteArray::fromRawData(reinterpret_cast<const char *>(frame.constBits()), int(frame.sizeInBytes()));
+    };
+    if (o.output == QLatin1String("-")) {
+        QFile out;
+        out.open(stdout, QIODevice::WriteOnly);
+        for (int i = 0; i < o.frames; ++i) {
+            if (out.write(nextFrame(i)) != frame.sizeInBytes())
+                return cli::fail(QStringLiteral("cannot write to stdout: %1").arg(out.errorString()));
         }
+        return out.flush() ? 0 : cli::fail(QStringLiteral("cannot write to stdout: %1").arg(out.errorString()));
     }
+    AtomicFileWriter out(o.output);
+    if (!out.open())
+        return cli::fail(QStringLiteral("cannot write %1: %2").arg(o.output, out.errorString()));
+    for (int i = 0; i < o.frames && out.write(nextFrame(i)); ++i) {
+    }
+    if (!out.commit())
+        return cli::fail(QStringLiteral("cannot write %1, nothing was changed: %2").arg(o.output, out.errorString()));
     return 0;
 }
 
 int encode(const EncodeOptions &o)
 {
+    // The encoder touches the target only to put a complete film there, so nothing
+    // on disk needs undoing when it fails.
     const QString target = QFileInfo(o.output).absoluteFilePath();
     if (!QFileInfo::exists(EncoderLibrary::filePath()))
         return cli::fail(QStringLiteral("encoder library not found: %1").arg(EncoderLibrary::filePath()));
-    const bool existed = QFileInfo::exists(target);
-    auto discard = [&] {
-        if (!existed)
-            QFile::remove(target);
-    };
 
     QElapsedTimer clock;
     clock.start();
     auto *worker = new ExportWorker;
     if (!worker->start(o.size.width(), o.size.height(), FrameRate, target, o.mp4)) {
-        const bool loaded = EncoderLibrary::isLoaded();
+        const QString reason = worker->errorString();
         delete worker;
-        discard();
-        return loaded ? cli::fail(QStringLiteral("cannot create the film %1").arg(target))
-                      : cli::fail(QStringLiteral("cannot load the encoder library %1").arg(EncoderLibrary::filePath()));
+        return cli::fail(reason);
     }
 
     QThread thread;
@@ -257,16 +264,18 @@ int encode(const EncodeOptions &o)
     QObject::connect(&feeder, &FrameFeeder::finalizeExport, worker, &ExportWorker::finalizeExport);
     QObject::connect(worker, &ExportWorker::frameExportFinished, &feeder, &FrameFeeder::next);
     QObject::connect(worker, &ExportWorker::finalized, &loop, &QEventLoop::quit);
+    QObject::connect(worker, &ExportWorker::exportFailed, &feeder, &FrameFeeder::stop);
     feeder.next();
     loop.exec();
     thread.quit();
     thread.wait();
+    const QString failure = worker->errorString();
     delete worker;
+    if (!failure.isEmpty())
+        return cli::fail(failure);
 
-    if (o.hasComment && !VideoComment::write(target, o.comment)) {
-        discard();
-        return cli::fail(QStringLiteral("cannot write the comment into %1").arg(target));
-    }
+    if (o.hasComment && !VideoComment::write(target, o.comment))
+        return cli::fail(QStringLiteral("the film %1 is complete, but its comment could not be written").arg(target));
     const double seconds = clock.nsecsElapsed() / 1e9;
     const QSize film = ExportWorker::exportSize(o.size.width());
     cli::printJson({{QStringLiteral("frames"), o.frames},

@@ -3,6 +3,7 @@
 
 #include "animation/AnimationEventList.h"
 #include "animation/FlyInCamera.h"
+#include "app/AppSettings.h"
 #include "project/DocumentAnimationSource.h"
 #include "project/DocumentFile.h"
 #include "project/PainterPathRenderer_Controller.h"
@@ -89,11 +90,25 @@ int runEvents(const QStringList &arguments)
     if (!takeSwitch(args, QStringLiteral("--linear"), linear, linearGiven, error) ||
         !takeSwitch(args, QStringLiteral("--flyin"), flyIn, flyInGiven, error))
         return cli::fail(error);
+    // The longest film as the user chose it in the program, unless given here.
+    uint32_t maxDuration = uint32_t(AppSettings().maxAnimationDuration());
+    QString maxDurationText;
+    if (cli::takeOption(args, QStringLiteral("--max-duration"), maxDurationText, &error)) {
+        bool ok = false;
+        maxDuration = maxDurationText.toUInt(&ok);
+        if (!ok || maxDuration > 4)
+            return cli::fail(QStringLiteral("--max-duration takes 0 (1 min), 1 (5 min), 2 (10 min), 3 (30 min) or 4 (60 min), "
+                                            "not '%1'")
+                                 .arg(maxDurationText));
+    } else if (!error.isEmpty()) {
+        return cli::fail(error);
+    }
     if (args.size() != 1 || args.first().startsWith(QLatin1String("--")))
         return cli::fail(QStringLiteral("events needs exactly one FILE"));
     const QString fileName = args.first();
 
     PainterPathRenderer_Controller document;
+    document.setMaxAnimationDuration(maxDuration);
     const DocumentOpenResult opened = openDocumentFile(document, fileName);
     if (!opened.ok())
         return cli::fail(QStringLiteral("%1: %2").arg(fileName, opened.reason));
@@ -139,6 +154,8 @@ int runEvents(const QStringList &arguments)
 
 CliCommand eventsCommand()
 {
-    return {"events", "events FILE [--linear 0|1] [--flyin 0|1] [--summary]   the per-frame events of a start of playback",
+    return {"events",
+            "events FILE [--linear 0|1] [--flyin 0|1] [--max-duration 0..4] [--summary]   the per-frame events of a start\n"
+            "      of playback; the longest film is the stored choice \"MaxAnimationDuration\" unless given",
             runEvents};
 }

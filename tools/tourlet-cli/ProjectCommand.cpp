@@ -1,5 +1,6 @@
 #include "Commands.h"
 
+#include "gpx/GpxWriter.h"
 #include "project/DocumentFile.h"
 #include "project/PainterPathRenderer_Controller.h"
 #include "project/ProjectFieldSink.h"
@@ -52,6 +53,7 @@ QJsonObject describePath(const Path *path)
         return {};
     QJsonArray keys;
     for (const KeyPoint &k : path->keyPoints) {
+        const KeyPointFont &font = k.properties.font;
         keys.append(QJsonObject{{QStringLiteral("longitude"), k.longitude},
                                 {QStringLiteral("latitude"), k.latitude},
                                 {QStringLiteral("altitude"), k.altitude},
@@ -59,7 +61,15 @@ QJsonObject describePath(const Path *path)
                                 {QStringLiteral("y"), k.y},
                                 {QStringLiteral("title"), k.properties.title},
                                 {QStringLiteral("durationToNextKP"), k.properties.durationToNextKP},
-                                {QStringLiteral("durationPause"), k.properties.durationPause}});
+                                {QStringLiteral("durationPause"), k.properties.durationPause},
+                                {QStringLiteral("size"), k.properties.size},
+                                {QStringLiteral("imageSource"), k.properties.imageSource},
+                                {QStringLiteral("font"), QJsonObject{{QStringLiteral("family"), font.family},
+                                                                     {QStringLiteral("pointSize"), font.pointSize},
+                                                                     {QStringLiteral("style"), qint64(font.style)},
+                                                                     {QStringLiteral("color"), font.color},
+                                                                     {QStringLiteral("hasFrame"), font.hasFrame},
+                                                                     {QStringLiteral("hasShadow"), font.hasShadow}}}});
     }
     QJsonArray segments;
     for (const PathSegment &s : path->pathSegments) {
@@ -164,7 +174,8 @@ int runConvert(const QStringList &arguments)
     if (!result.ok())
         return openFailure(input, result);
     if (!saveDocumentFile(document, output))
-        return cli::fail(QStringLiteral("%1: can't be written").arg(output));
+        return cli::fail(QStringLiteral("%1: can't be written, nothing was changed: %2")
+                             .arg(output, document.projectController().lastWriteError()));
     const Path *path = document.pathManager().active();
     cli::printJson({{QStringLiteral("input"), input},
                     {QStringLiteral("output"), output},
@@ -172,6 +183,33 @@ int runConvert(const QStringList &arguments)
                                                                                               : QStringLiteral("project")},
                     {QStringLiteral("keyPointCount"), path ? int(path->keyPoints.size()) : 0},
                     {QStringLiteral("curvePointCount"), path ? int(path->curvePoints.size()) : 0}});
+    return 0;
+}
+
+// The route of a project or track, written as the window's "export GPX" writes it.
+int runGpx(const QStringList &arguments)
+{
+    QStringList args = arguments;
+    QString output, error;
+    if (!cli::takeOption(args, QStringLiteral("-o"), output, &error))
+        return cli::fail(error.isEmpty() ? QStringLiteral("gpx needs -o OUT.gpx") : error);
+    if (args.size() != 1)
+        return cli::fail(QStringLiteral("gpx needs exactly one INPUT"));
+    const QString input = args.first();
+
+    PainterPathRenderer_Controller document;
+    const DocumentOpenResult result = openDocumentFile(document, input);
+    if (!result.ok())
+        return openFailure(input, result);
+    const std::vector<CurvePoint> samples = document.pathManager().routeSamples();
+    const Path *path = document.pathManager().active();
+    if (!GpxWriter::write(output, samples, path ? *path : Path(), &error))
+        return cli::fail(QStringLiteral("%1: can't be written, nothing was changed: %2").arg(output, error));
+    cli::printJson({{QStringLiteral("input"), input},
+                    {QStringLiteral("output"), output},
+                    {QStringLiteral("kind"), result.status == DocumentOpenResult::Status::Track ? QStringLiteral("track")
+                                                                                              : QStringLiteral("project")},
+                    {QStringLiteral("samples"), int(samples.size())}});
     return 0;
 }
 
@@ -186,4 +224,9 @@ CliCommand convertCommand()
 {
     return {"convert", "convert INPUT -o OUTPUT.zkgeo [--aliasing N]   open a project or track and save it as a project",
             runConvert};
+}
+
+CliCommand gpxCommand()
+{
+    return {"gpx", "gpx INPUT -o OUT.gpx   open a project or track and write its route as the GPX export does", runGpx};
 }

@@ -92,8 +92,8 @@ int runTrack(const QStringList &arguments)
     Path path;
     if (!TrackImport::read(fileName, path, aliasing, TrackImport::fixedDuration, &file))
         return cli::fail(QStringLiteral("%1: not a readable track file (GPX, KML, KMZ, TCX or TRK)").arg(fileName));
-    if (!gpxOut.isEmpty() && !GpxWriter::write(gpxOut, path.curvePoints, path))
-        return cli::fail(QStringLiteral("%1: can't write the GPX file").arg(gpxOut));
+    if (!gpxOut.isEmpty() && !GpxWriter::write(gpxOut, path.curvePoints, path, &error))
+        return cli::fail(QStringLiteral("%1: can't write the GPX file, nothing was changed: %2").arg(gpxOut, error));
     cli::printJsonText(describe(file, path));
     return 0;
 }

@@ -1,10 +1,11 @@
 #include "CommentRewriter.h"
 
+#include "ReplacingFile.h"
+
 extern "C" {
 #include <libavformat/avformat.h>
 }
 
-#include <cstdio>
 #include <cstring>
 
 namespace {
@@ -83,25 +84,24 @@ bool copyWithComment(Remux &r, const std::string &from, const std::string &to, c
         if (av_interleaved_write_frame(r.out, r.packet) < 0)
             return false;
     }
-    if (read != AVERROR_EOF)
+    if (read != AVERROR_EOF || av_write_trailer(r.out) < 0)
         return false;
-    return av_write_trailer(r.out) >= 0;
+    avio_flush(r.out->pb);
+    const int error = r.out->pb->error;
+    return avio_closep(&r.out->pb) >= 0 && error >= 0;
 }
 
 } // namespace
 
 bool rewriteWithComment(const std::string &fileName, const std::string &comment)
 {
-    if (fileName.empty())
+    ReplacingFile copy;
+    if (!copy.create(fileName))
         return false;
-    const std::string temporary = fileName + ".comment.tmp";
     bool ok;
     {
         Remux r;
-        ok = copyWithComment(r, fileName, temporary, comment);
+        ok = copyWithComment(r, "file:" + fileName, "file:" + copy.path(), comment);
     }
-    if (ok && std::rename(temporary.c_str(), fileName.c_str()) == 0)
-        return true;
-    std::remove(temporary.c_str());
-    return false;
+    return ok && copy.commit();
 }

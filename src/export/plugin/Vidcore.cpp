@@ -32,14 +32,14 @@ bool opOpen(VidcoreExport *self, const wchar_t *fileName, VidcoreParameters *par
     return parameters && encoderOf(self).open(utf8FromWide(fileName), *parameters);
 }
 
-void opWriteFrame(VidcoreExport *self, const uint8_t *pixels, uint32_t byteCount, uint32_t timestamp)
+bool opWriteFrame(VidcoreExport *self, const uint8_t *pixels, uint32_t byteCount, uint32_t timestamp)
 {
-    encoderOf(self).writeFrame(pixels, byteCount, timestamp);
+    return encoderOf(self).writeFrame(pixels, byteCount, timestamp);
 }
 
-void opFinish(VidcoreExport *self)
+bool opFinish(VidcoreExport *self)
 {
-    encoderOf(self).finish();
+    return encoderOf(self).finish();
 }
 
 void opClose(VidcoreExport *self)
@@ -53,7 +53,12 @@ void opGetParameters(VidcoreExport *self, VidcoreParameters *parameters)
         *parameters = encoderOf(self).parameters();
 }
 
-const VidcoreOperations operationTable = {opOpen, opWriteFrame, opFinish, opClose, opGetParameters};
+const char *opErrorText(VidcoreExport *self)
+{
+    return encoderOf(self).errorText().c_str();
+}
+
+const VidcoreOperations operationTable = {opOpen, opWriteFrame, opFinish, opClose, opGetParameters, opErrorText};
 
 ExportObject::ExportObject(int32_t format)
     : VidcoreExport{&operationTable}

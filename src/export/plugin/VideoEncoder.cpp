@@ -9,8 +9,8 @@ extern "C" {
 }
 
 #include <algorithm>
+#include <cerrno>
 #include <cmath>
-#include <cstdio>
 #include <cstring>
 
 namespace {
@@ -60,21 +60,40 @@ bool VideoEncoder::open(const std::string &fileName, const VidcoreParameters &pa
         m_parameters.sourceWidth = p.targetWidth;
         m_parameters.sourceHeight = p.targetHeight;
     }
-    m_fileName = fileName;
     m_nextPts = 0;
     m_finished = false;
-    m_fileCreated = false;
+    m_failed = false;
+    m_errorText.clear();
+    // The film grows beside the target and replaces it only when complete.
+    if (!m_output.create(fileName)) {
+        m_errorText = m_output.errorText();
+        return false;
+    }
+    // The protocol named, so that a colon in a file name is no protocol of its own.
+    m_url = "file:" + m_output.path();
     if (setUp())
         return true;
     close();
-    discardFile();
+    return false;
+}
+
+bool VideoEncoder::check(int result)
+{
+    if (result >= 0)
+        return true;
+    if (!m_failed) {
+        m_failed = true;
+        char text[AV_ERROR_MAX_STRING_SIZE] = {};
+        av_strerror(result, text, sizeof text);
+        m_errorText = text;
+    }
     return false;
 }
 
 bool VideoEncoder::setUp()
 {
     const bool mp4 = m_format == VidcoreFormatMp4;
-    if (avformat_alloc_output_context2(&m_container, nullptr, mp4 ? "mp4" : "asf", m_fileName.c_str()) < 0)
+    if (!check(avformat_alloc_output_context2(&m_container, nullptr, mp4 ? "mp4" : "asf", m_url.c_str())))
         return false;
     m_stream = avformat_new_stream(m_container, nullptr);
     if (!m_stream || !configureCodec())
@@ -85,15 +104,14 @@ bool VideoEncoder::setUp()
     m_stream->avg_frame_rate = m_codec->framerate;
     m_stream->r_frame_rate = m_codec->framerate;
 
-    if (avio_open(&m_container->pb, m_fileName.c_str(), AVIO_FLAG_WRITE) < 0)
+    if (!check(avio_open(&m_container->pb, m_url.c_str(), AVIO_FLAG_WRITE)))
         return false;
-    m_fileCreated = true;
     AVDictionary *options = nullptr;
     if (mp4)
         av_dict_set(&options, "movflags", "+faststart", 0); // index first: plays while loading
     const int header = avformat_write_header(m_container, &options);
     av_dict_free(&options);
-    if (header < 0)
+    if (!check(header))
         return false;
 
     const VidcoreParameters &p = m_parameters;
@@ -154,16 +172,18 @@ bool VideoEncoder::configureCodec()
     return avcodec_open2(m_codec, codec, nullptr) >= 0;
 }
 
-void VideoEncoder::writeFrame(const uint8_t *pixels, uint32_t byteCount, uint32_t timestamp)
+bool VideoEncoder::writeFrame(const uint8_t *pixels, uint32_t byteCount, uint32_t timestamp)
 {
+    if (m_failed)
+        return false;
     if (!m_scaler || m_finished || !pixels)
-        return;
+        return true;
     const VidcoreParameters &p = m_parameters;
     const int stride = int(p.sourceWidth) * 4;
     if (uint64_t(byteCount) < uint64_t(stride) * p.sourceHeight)
-        return;
-    if (av_frame_make_writable(m_frame) < 0)
-        return;
+        return true;
+    if (!check(av_frame_make_writable(m_frame)))
+        return false;
     const uint8_t *planes[1] = {pixels};
     const int strides[1] = {stride};
     sws_scale(m_scaler, planes, strides, 0, int(p.sourceHeight), m_frame->data, m_frame->linesize);
@@ -174,27 +194,48 @@ void VideoEncoder::writeFrame(const uint8_t *pixels, uint32_t byteCount, uint32_
         pts = std::max<int64_t>(pts, timestamp);
     m_frame->pts = pts;
     m_nextPts = pts + 1;
-    if (avcodec_send_frame(m_codec, m_frame) >= 0)
+    if (check(avcodec_send_frame(m_codec, m_frame)))
         writePackets();
+    return !m_failed;
 }
 
 void VideoEncoder::writePackets()
 {
-    while (avcodec_receive_packet(m_codec, m_packet) >= 0) {
+    int received;
+    while ((received = avcodec_receive_packet(m_codec, m_packet)) >= 0) {
         av_packet_rescale_ts(m_packet, m_codec->time_base, m_stream->time_base);
         m_packet->stream_index = m_stream->index;
-        av_interleaved_write_frame(m_container, m_packet);
+        if (!check(av_interleaved_write_frame(m_container, m_packet)))
+            return;
     }
+    if (received != AVERROR(EAGAIN) && received != AVERROR_EOF)
+        check(received);
 }
 
-void VideoEncoder::finish()
+bool VideoEncoder::finish()
 {
-    if (!m_scaler || m_finished)
-        return;
+    if (!m_scaler)
+        return false;
+    if (m_finished)
+        return !m_failed;
     m_finished = true;
-    if (avcodec_send_frame(m_codec, nullptr) >= 0)
+    if (!m_failed && check(avcodec_send_frame(m_codec, nullptr)))
         writePackets();
-    av_write_trailer(m_container);
+    if (!m_failed)
+        check(av_write_trailer(m_container));
+    // What is still buffered, and what the file system says at the close, count too.
+    if (m_container->pb) {
+        avio_flush(m_container->pb);
+        check(m_container->pb->error);
+        check(avio_closep(&m_container->pb));
+    }
+    if (!m_failed && !m_output.commit()) {
+        m_failed = true;
+        m_errorText = m_output.errorText();
+    }
+    if (m_failed)
+        m_output.discard();
+    return !m_failed;
 }
 
 void VideoEncoder::close()
@@ -211,11 +252,5 @@ void VideoEncoder::close()
         m_container = nullptr;
     }
     m_stream = nullptr;
-}
-
-void VideoEncoder::discardFile()
-{
-    if (m_fileCreated)
-        std::remove(m_fileName.c_str());
-    m_fileCreated = false;
+    m_output.discard();
 }
