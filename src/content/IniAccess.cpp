@@ -2,6 +2,7 @@
 
 #include "app/Trace.h"
 #include "content/ContentIni.h"
+#include "platform/TextDecoding.h"
 
 #include <QDir>
 #include <QDirIterator>
@@ -40,6 +41,19 @@ bool isReadableIni(const QString &file)
     return true;
 }
 
+// The platform format reads one encoding, which it has to be told: that of the file's
+// bytes, by the rules the content format applies itself.
+const char *platformCodecOf(const QString &file)
+{
+    QFile f(file);
+    if (!f.open(QIODevice::ReadOnly))
+        return "UTF-8";
+    const QByteArray bytes = f.read(maxIniFileSize);
+    if (textdecoding::codecByMark(bytes) || textdecoding::isUtf8(bytes.constData(), bytes.size()))
+        return "UTF-8";
+    return "windows-1252";
+}
+
 std::shared_ptr<const QSettings::SettingsMap> readContentIniFile(const QString &file)
 {
     if (activeCache) {
@@ -66,7 +80,7 @@ QVariant readPlatformIni(const QString &file, const QString &address)
             std::shared_ptr<QSettings> settings;
             if (isReadableIni(file)) {
                 settings = std::make_shared<QSettings>(file, QSettings::IniFormat);
-                settings->setIniCodec("UTF-8");
+                settings->setIniCodec(platformCodecOf(file));
             }
             hit = activeCache->platformIni.insert(file, settings);
         }
@@ -75,7 +89,7 @@ QVariant readPlatformIni(const QString &file, const QString &address)
     if (!isReadableIni(file))
         return QVariant();
     QSettings settings(file, QSettings::IniFormat);
-    settings.setIniCodec("UTF-8");
+    settings.setIniCodec(platformCodecOf(file));
     return settings.value(address);
 }
 
@@ -176,8 +190,9 @@ bool prependIniListValue(const QString &file, const QString &value, const QStrin
     if (file.isEmpty())
         return false;
     forgetCached(file);
+    // Written back in the encoding it was read in.
     QSettings settings(file, QSettings::IniFormat);
-    settings.setIniCodec("UTF-8");
+    settings.setIniCodec(platformCodecOf(file));
     QStringList list = readWritableList(settings, address(section, key));
     list.prepend(value);
     writeList(settings, address(section, key), list);
@@ -194,8 +209,9 @@ bool removeIniListValue(const QString &file, const QString &stem, const QString 
     if (file.isEmpty() || !QFileInfo::exists(file))
         return false;
     forgetCached(file);
+    // Written back in the encoding it was read in.
     QSettings settings(file, QSettings::IniFormat);
-    settings.setIniCodec("UTF-8");
+    settings.setIniCodec(platformCodecOf(file));
     QStringList kept;
     for (const QString &entry : readWritableList(settings, address(section, key)))
         if (QFileInfo(withoutTrailingSlashes(entry)).baseName() != stem)

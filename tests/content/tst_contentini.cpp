@@ -120,10 +120,11 @@ private slots:
             QCOMPARE(value(file, QStringLiteral("grüße"), QStringLiteral("NAME")), QStringLiteral("Fähre ✈"));
             QCOMPARE(value(file, QStringLiteral("Grüße"), QStringLiteral("other")), QStringLiteral("東京"));
         }
-        // Bytes that are no UTF-8 are taken as Latin-1.
-        const QString latin = path(QStringLiteral("latin1.ini"));
-        QVERIFY(writeFile(latin, "[main]\nname=F\xE4hre\n"));
-        QCOMPARE(value(latin, QStringLiteral("main"), QStringLiteral("name")), QStringLiteral("Fähre"));
+        // Bytes that are no UTF-8 are taken as Windows-1252, in both formats.
+        const QString windows = path(QStringLiteral("cp1252.ini"));
+        QVERIFY(writeFile(windows, "[main]\nname=F\xE4hre \x80\n"));
+        QCOMPARE(value(windows, QStringLiteral("main"), QStringLiteral("name")), QStringLiteral("Fähre €"));
+        QCOMPARE(readIniValue(windows, QStringLiteral("main"), QStringLiteral("name"), false), QStringLiteral("Fähre €"));
     }
 
     void damagedFilesGiveDefaults()

@@ -8,6 +8,17 @@
 #include <QTemporaryDir>
 #include <QTest>
 
+#include <sys/resource.h>
+
+namespace {
+long peakRssKiB()
+{
+    rusage usage{};
+    getrusage(RUSAGE_SELF, &usage);
+    return usage.ru_maxrss;
+}
+}
+
 class TestTrackFile : public QObject
 {
     Q_OBJECT
@@ -395,6 +406,17 @@ private slots:
         QCOMPARE(file.items()[0].points.size(), 3);
         QVERIFY(file.load(write("old.trk", QByteArray(latin1).replace("\r\n", "\r"))));
         QCOMPARE(file.items()[0].points.size(), 3);
+
+        // Floods of line ends and an overlong line are read in little memory; the overlong
+        // line is skipped whole and the point after it still read.
+        const QString flood = write("flood.trk", QByteArray(8 << 20, '\n') + QByteArray(8 << 20, '\r') +
+                                                     "T  A 10\xBAN 20\xBA" "E " + QByteArray(100000, 'x') + "\r\n" +
+                                                     latin1.mid(latin1.indexOf("T  A 47.27")));
+        const long peakBefore = peakRssKiB();
+        QVERIFY(file.load(flood));
+        QCOMPARE(file.items()[0].points.size(), 2);
+        QCOMPARE(file.items()[0].points[0].latitude, 47.27);
+        QVERIFY2(peakRssKiB() - peakBefore < 16 * 1024, qPrintable(QString::number(peakRssKiB() - peakBefore)));
 
         // Not a trk by its suffix: read as XML and refused.
         QVERIFY(!file.load(write("route.trk.txt", latin1)));
