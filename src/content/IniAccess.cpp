@@ -11,6 +11,7 @@
 #include <QHash>
 #include <QSettings>
 
+#include <algorithm>
 #include <memory>
 
 namespace {
@@ -258,9 +259,18 @@ QStringList listFileStems(const QString &folder, const QString &pattern)
     return stems;
 }
 
-QStringList listInformationStems(const QString &folder)
+QStringList listInformationFiles(const QString &folder)
 {
-    return listFileStems(folder + QStringLiteral("/informations/"), QStringLiteral("*.ini"));
+    const QDir dir(folder + QStringLiteral("/informations/"));
+    if (folder.isEmpty() || !dir.exists())
+        return {};
+    // Made on systems that don't tell "x.INI" from "x.ini".
+    QStringList names = dir.entryList(QStringList{QStringLiteral("*.ini")}, QDir::Files);
+    std::sort(names.begin(), names.end(), [](const QString &a, const QString &b) {
+        const int byStem = QFileInfo(a).completeBaseName().compare(QFileInfo(b).completeBaseName(), Qt::CaseInsensitive);
+        return byStem != 0 ? byStem < 0 : a < b;
+    });
+    return names;
 }
 
 bool samePath(const QString &a, const QString &b)

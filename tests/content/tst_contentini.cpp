@@ -235,10 +235,12 @@ private slots:
     {
         const QString root = path(QStringLiteral("folders/"));
         for (const char *name : {"informations/b.ini", "informations/A.ini", "informations/c.INI", "informations/x.txt",
-                                 "informations/z.v2.ini", "sub1/deep/f", "sub2/f"})
+                                 "informations/z.v2.ini", "informations/a-b.ini", "sub1/deep/f", "sub2/f"})
             QVERIFY(writeFile(root + QString::fromLatin1(name), "x"));
-        QCOMPARE(listInformationStems(root),
-                 QStringList({QStringLiteral("A"), QStringLiteral("b"), QStringLiteral("z.v2")}));
+        // Sorted by stem: "a-b" after "A" although "-" comes before ".".
+        QCOMPARE(listInformationFiles(root),
+                 QStringList({QStringLiteral("A.ini"), QStringLiteral("a-b.ini"), QStringLiteral("b.ini"),
+                              QStringLiteral("c.INI"), QStringLiteral("z.v2.ini")}));
         QCOMPARE(listFileStems(root + QStringLiteral("informations"), QStringLiteral("*.txt")), QStringList{QStringLiteral("x")});
         QVERIFY(listFileStems(root + QStringLiteral("nothing"), QStringLiteral("*.ini")).isEmpty());
         QStringList flat = listSubfolders(root, false);
