@@ -1,6 +1,8 @@
 // Reading a 200,000-point GPX track of about 20 MB, the size of a long day's recording.
 // Run with --write-gpx=FILE to only write the generated file (for comparisons).
 #include "gpx/TrackFile.h"
+#include "gpx/TrackImport.h"
+#include "path/Path.h"
 
 #include <QFile>
 #include <QTemporaryDir>
@@ -16,7 +18,9 @@ namespace {
 
 constexpr int pointCount = 200000;
 
-bool writeTrack(const QString &fileName)
+// `waypoints` named points follow the track, spread along it and a little beside it, as
+// a device stores them.
+bool writeTrack(const QString &fileName, int waypoints = 0)
 {
     QFile file(fileName);
     if (!file.open(QIODevice::WriteOnly | QIODevice::Truncate))
@@ -43,7 +47,14 @@ bool writeTrack(const QString &fileName)
             chunk.clear();
         }
     }
-    chunk += " </trkseg></trk>\n</gpx>\n";
+    chunk += " </trkseg></trk>\n";
+    for (int w = 0; w < waypoints; ++w) {
+        const int i = int((w + 0.5) * pointCount / waypoints);
+        std::snprintf(line, sizeof line, " <wpt lat=\"%.7f\" lon=\"%.7f\"><name>Stop %d</name></wpt>\n",
+                      46.0 + i * 0.0000123 + 0.00002, 7.0 + i * 0.0000171, w);
+        chunk += line;
+    }
+    chunk += "</gpx>\n";
     return file.write(chunk) == chunk.size();
 }
 
@@ -124,6 +135,31 @@ void BM_ReadLargeKml(benchmark::State &state)
     state.SetBytesProcessed(int64_t(state.iterations()) * QFile(fileName).size());
 }
 BENCHMARK(BM_ReadLargeKml)->Unit(benchmark::kMillisecond)->Iterations(3);
+
+// Opening such a track with 300 named waypoints: reading, conversion and the placing of
+// each waypoint on its nearest sample, by the "GpxAliasing" setting given.
+void BM_ImportTrackWithWaypoints(benchmark::State &state)
+{
+    QTemporaryDir folder;
+    const QString fileName = folder.filePath(QStringLiteral("waypoints.gpx"));
+    if (!writeTrack(fileName, 300)) {
+        state.SkipWithError("cannot write the track file");
+        return;
+    }
+    size_t keyPoints = 0, samples = 0;
+    for (auto _ : state) {
+        Path path;
+        if (!TrackImport::read(fileName, path, uint32_t(state.range(0)))) {
+            state.SkipWithError("read failed");
+            return;
+        }
+        keyPoints = path.keyPoints.size();
+        samples = path.curvePoints.size();
+    }
+    state.counters["key_points"] = double(keyPoints);
+    state.counters["samples"] = double(samples);
+}
+BENCHMARK(BM_ImportTrackWithWaypoints)->Arg(1)->Arg(0)->Unit(benchmark::kMillisecond)->Iterations(3);
 
 } // namespace
 

@@ -1,5 +1,5 @@
-// Loads any bytes as a ".kmz" file: archive opening, extraction into a temporary
-// folder and reading of the documents found there.
+// Loads any bytes as a ".kmz" file: archive opening, the choice of its document,
+// its extraction into a temporary folder and its reading.
 #include "FuzzConvert.h"
 #include "FuzzQuiet.h"
 #include "gpx/TrackFile.h"

@@ -187,9 +187,9 @@ QStringList ContentCatalogue::scanList(Kind kind, const QStringList &headFolders
     return folders;
 }
 
-ContentItem ContentCatalogue::scanItem(const QString &folder, const QString &stem, uint32_t packageIndex) const
+ContentItem ContentCatalogue::scanItem(const QString &folder, const QString &stem, const QString &ini,
+                                       uint32_t packageIndex) const
 {
-    const QString ini = folder + QStringLiteral("informations/") + stem + QStringLiteral(".ini");
     ContentItem item;
     item.id = nextContentItemId();
     item.packageIndex = packageIndex;
@@ -218,15 +218,13 @@ void ContentCatalogue::readGroups(const QStringList &folders)
     }
 }
 
-void ContentCatalogue::fillAvatar(AvatarItem &item, const QString &ini) const
+void ContentCatalogue::fillAvatar(AvatarItem &item, const QString &pkg, const QString &ini) const
 {
     item.allowRotation = isTrue(ini, QStringLiteral("allowRotation"));
     item.symmetric = isTrue(ini, QStringLiteral("symmetric"));
     item.animated = isTrue(ini, QStringLiteral("animated")) ? 1 : 0;
     const bool perspective =
         readIniValue(ini, mainSection, QStringLiteral("displayFormat"), false) == QLatin1String("perspective");
-    const QString tail = QStringLiteral("informations/") + item.name + QStringLiteral(".ini");
-    const QString pkg = ini.left(ini.size() - tail.size());
     item.defaultWidth = 120;
     if (perspective) {
         item.perspective = 1;
@@ -255,10 +253,12 @@ void ContentCatalogue::scanAvatars(const QStringList &folders)
     readGroups(folders);
     for (int index = 0; index < folders.size(); ++index) {
         const QString &folder = folders.at(index);
-        for (const QString &stem : listFileStems(folder + QStringLiteral("informations/"), QStringLiteral("*.ini"))) {
+        for (const QString &file : listInformationFiles(folder)) {
+            const QString ini = folder + QStringLiteral("informations/") + file;
+            const QString stem = QFileInfo(file).completeBaseName();
             AvatarItem item;
-            static_cast<ContentItem &>(item) = scanItem(folder, stem, uint32_t(index));
-            fillAvatar(item, folder + QStringLiteral("informations/") + stem + QStringLiteral(".ini"));
+            static_cast<ContentItem &>(item) = scanItem(folder, stem, ini, uint32_t(index));
+            fillAvatar(item, folder, ini);
             m_avatars.push_back(item);
         }
     }
@@ -271,10 +271,11 @@ void ContentCatalogue::scanWaypoints(const QStringList &folders)
 {
     for (int index = 0; index < folders.size(); ++index) {
         const QString &folder = folders.at(index);
-        for (const QString &stem : listFileStems(folder + QStringLiteral("informations/"), QStringLiteral("*.ini"))) {
-            const QString ini = folder + QStringLiteral("informations/") + stem + QStringLiteral(".ini");
+        for (const QString &file : listInformationFiles(folder)) {
+            const QString ini = folder + QStringLiteral("informations/") + file;
+            const QString stem = QFileInfo(file).completeBaseName();
             WaypointItem item;
-            static_cast<ContentItem &>(item) = scanItem(folder, stem, uint32_t(index));
+            static_cast<ContentItem &>(item) = scanItem(folder, stem, ini, uint32_t(index));
             item.animated = isTrue(ini, QStringLiteral("animated")) ? 1 : 0;
             item.isMediaTemplate = isTrue(ini, QStringLiteral("media"));
             if (item.isMediaTemplate) {
@@ -296,10 +297,11 @@ void ContentCatalogue::scanMaps(const QStringList &folders)
 {
     for (int index = 0; index < folders.size(); ++index) {
         const QString &folder = folders.at(index);
-        for (const QString &stem : listFileStems(folder + QStringLiteral("informations/"), QStringLiteral("*.ini"))) {
-            const QString ini = folder + QStringLiteral("informations/") + stem + QStringLiteral(".ini");
+        for (const QString &file : listInformationFiles(folder)) {
+            const QString ini = folder + QStringLiteral("informations/") + file;
+            const QString stem = QFileInfo(file).completeBaseName();
             MapItem item;
-            static_cast<ContentItem &>(item) = scanItem(folder, stem, uint32_t(index));
+            static_cast<ContentItem &>(item) = scanItem(folder, stem, ini, uint32_t(index));
             item.mainCategory = readIniValue(ini, mainSection, QStringLiteral("item_main_category"), false,
                                              QStringLiteral("europe_shop"));
             item.elementId = readIniValue(ini, mainSection, QStringLiteral("origins"), false);
@@ -317,10 +319,11 @@ void ContentCatalogue::scanMasks(const QStringList &folders)
 {
     for (int index = 0; index < folders.size(); ++index) {
         const QString &folder = folders.at(index);
-        for (const QString &stem : listFileStems(folder + QStringLiteral("informations/"), QStringLiteral("*.ini"))) {
-            const QString ini = folder + QStringLiteral("informations/") + stem + QStringLiteral(".ini");
+        for (const QString &file : listInformationFiles(folder)) {
+            const QString ini = folder + QStringLiteral("informations/") + file;
+            const QString stem = QFileInfo(file).completeBaseName();
             MaskItem item;
-            static_cast<ContentItem &>(item) = scanItem(folder, stem, uint32_t(index));
+            static_cast<ContentItem &>(item) = scanItem(folder, stem, ini, uint32_t(index));
             item.guid = readIniValue(ini, mainSection, QStringLiteral("guid"), false,
                                      QStringLiteral("{00000000-0000-0000-0000-000000000000}"));
             item.fileName = QFileInfo(item.sourceFile).fileName();

@@ -57,13 +57,14 @@ public:
 private:
     QString translationIni(const QString &folder) const;
     QString findSetRoot(const QString &marker) const;
-    ContentItem scanItem(const QString &folder, const QString &stem, uint32_t packageIndex) const;
+    ContentItem scanItem(const QString &folder, const QString &stem, const QString &ini, uint32_t packageIndex) const;
     void readGroups(const QStringList &folders);
     void scanAvatars(const QStringList &folders);
     void scanWaypoints(const QStringList &folders);
     void scanMaps(const QStringList &folders);
     void scanMasks(const QStringList &folders);
-    void fillAvatar(AvatarItem &item, const QString &iniPath) const;
+    // pkg is the content folder the ini lies in.
+    void fillAvatar(AvatarItem &item, const QString &pkg, const QString &iniPath) const;
 
     QString m_utpRoot;
     QString m_teeRoot;

@@ -1,8 +1,9 @@
 #include "content/ContentIni.h"
 
+#include "platform/TextDecoding.h"
+
 #include <QIODevice>
 #include <QRegExp>
-#include <QTextCodec>
 #include <QVector>
 
 namespace ContentIni {
@@ -33,19 +34,6 @@ QSettings::Format format()
     return registered;
 }
 
-QString decode(const QByteArray &data)
-{
-    QTextCodec *utf8 = QTextCodec::codecForName("UTF-8");
-    QTextCodec *codec = QTextCodec::codecForUtfText(data, nullptr);
-    if (codec)
-        return codec->toUnicode(data);
-    QTextCodec::ConverterState state;
-    const QString text = utf8->toUnicode(data.constData(), data.size(), &state);
-    if (state.invalidChars == 0 && state.remainingChars == 0)
-        return text;
-    return QString::fromLatin1(data);
-}
-
 QString lookupKey(const QString &section, const QString &key)
 {
     QString full = section.isEmpty() ? key : section + QLatin1Char('/') + key;
@@ -64,7 +52,7 @@ QString lookupKey(const QString &section, const QString &key)
 
 void parse(const QByteArray &data, QSettings::SettingsMap &map)
 {
-    const QString text = decode(data);
+    const QString text = textdecoding::decode(data);
     const QStringList lines = text.split(QRegExp(QStringLiteral("(\\r\\n)|\\r|\\n")), Qt::SkipEmptyParts);
     QRegExp section(QString::fromLatin1(sectionPattern));
     QRegExp keyLine(QString::fromLatin1(keyPattern));

@@ -19,12 +19,9 @@ namespace ContentIni {
 QSettings::Format format();
 
 // Parses the text of one file into map. Never fails: lines that are neither a
-// section header nor a key line are skipped.
+// section header nor a key line are skipped. The encoding is that of a byte-order
+// mark; without one UTF-8 when valid, else Windows-1252.
 void parse(const QByteArray &data, QSettings::SettingsMap &map);
-
-// Decodes file bytes: UTF-8 or UTF-16 by byte-order mark; without one, UTF-8
-// when the bytes are valid UTF-8, else Latin-1.
-QString decode(const QByteArray &data);
 
 // The lookup key of section/key as the format stores it.
 QString lookupKey(const QString &section, const QString &key);

@@ -2,6 +2,7 @@
 
 #include "app/Trace.h"
 #include "content/ContentIni.h"
+#include "platform/TextDecoding.h"
 
 #include <QDir>
 #include <QDirIterator>
@@ -10,6 +11,7 @@
 #include <QHash>
 #include <QSettings>
 
+#include <algorithm>
 #include <memory>
 
 namespace {
@@ -40,6 +42,19 @@ bool isReadableIni(const QString &file)
     return true;
 }
 
+// The platform format reads one encoding, which it has to be told: that of the file's
+// bytes, by the rules the content format applies itself.
+const char *platformCodecOf(const QString &file)
+{
+    QFile f(file);
+    if (!f.open(QIODevice::ReadOnly))
+        return "UTF-8";
+    const QByteArray bytes = f.read(maxIniFileSize);
+    if (textdecoding::codecByMark(bytes) || textdecoding::isUtf8(bytes.constData(), bytes.size()))
+        return "UTF-8";
+    return "windows-1252";
+}
+
 std::shared_ptr<const QSettings::SettingsMap> readContentIniFile(const QString &file)
 {
     if (activeCache) {
@@ -66,7 +81,7 @@ QVariant readPlatformIni(const QString &file, const QString &address)
             std::shared_ptr<QSettings> settings;
             if (isReadableIni(file)) {
                 settings = std::make_shared<QSettings>(file, QSettings::IniFormat);
-                settings->setIniCodec("UTF-8");
+                settings->setIniCodec(platformCodecOf(file));
             }
             hit = activeCache->platformIni.insert(file, settings);
         }
@@ -75,7 +90,7 @@ QVariant readPlatformIni(const QString &file, const QString &address)
     if (!isReadableIni(file))
         return QVariant();
     QSettings settings(file, QSettings::IniFormat);
-    settings.setIniCodec("UTF-8");
+    settings.setIniCodec(platformCodecOf(file));
     return settings.value(address);
 }
 
@@ -176,8 +191,9 @@ bool prependIniListValue(const QString &file, const QString &value, const QStrin
     if (file.isEmpty())
         return false;
     forgetCached(file);
+    // Written back in the encoding it was read in.
     QSettings settings(file, QSettings::IniFormat);
-    settings.setIniCodec("UTF-8");
+    settings.setIniCodec(platformCodecOf(file));
     QStringList list = readWritableList(settings, address(section, key));
     list.prepend(value);
     writeList(settings, address(section, key), list);
@@ -194,8 +210,9 @@ bool removeIniListValue(const QString &file, const QString &stem, const QString 
     if (file.isEmpty() || !QFileInfo::exists(file))
         return false;
     forgetCached(file);
+    // Written back in the encoding it was read in.
     QSettings settings(file, QSettings::IniFormat);
-    settings.setIniCodec("UTF-8");
+    settings.setIniCodec(platformCodecOf(file));
     QStringList kept;
     for (const QString &entry : readWritableList(settings, address(section, key)))
         if (QFileInfo(withoutTrailingSlashes(entry)).baseName() != stem)
@@ -242,9 +259,18 @@ QStringList listFileStems(const QString &folder, const QString &pattern)
     return stems;
 }
 
-QStringList listInformationStems(const QString &folder)
+QStringList listInformationFiles(const QString &folder)
 {
-    return listFileStems(folder + QStringLiteral("/informations/"), QStringLiteral("*.ini"));
+    const QDir dir(folder + QStringLiteral("/informations/"));
+    if (folder.isEmpty() || !dir.exists())
+        return {};
+    // Made on systems that don't tell "x.INI" from "x.ini".
+    QStringList names = dir.entryList(QStringList{QStringLiteral("*.ini")}, QDir::Files);
+    std::sort(names.begin(), names.end(), [](const QString &a, const QString &b) {
+        const int byStem = QFileInfo(a).completeBaseName().compare(QFileInfo(b).completeBaseName(), Qt::CaseInsensitive);
+        return byStem != 0 ? byStem < 0 : a < b;
+    });
+    return names;
 }
 
 bool samePath(const QString &a, const QString &b)

@@ -32,8 +32,9 @@ QStringList listSubfolders(const QString &path, bool recursive);
 // Stems of the files in folder that match pattern, sorted by name ignoring case;
 // empty if the folder doesn't exist.
 QStringList listFileStems(const QString &folder, const QString &pattern);
-// The stems of folder + "/informations/*.ini".
-QStringList listInformationStems(const QString &folder);
+// The names of the files folder + "/informations/*.ini", the suffix in any case,
+// sorted by stem ignoring case.
+QStringList listInformationFiles(const QString &folder);
 bool samePath(const QString &a, const QString &b);
 
 // While one of these lives, reads on this thread are answered from the files

@@ -34,6 +34,10 @@ void KmlReader::readPlacemark()
             readPoint(name);
         else if (isNamed(m_xml, QLatin1String("MultiGeometry")))
             readMultiGeometry();
+        else if (isNamed(m_xml, QLatin1String("Track")))
+            readTrack();
+        else if (isNamed(m_xml, QLatin1String("MultiTrack")))
+            readMultiTrack();
         else
             m_xml.skipCurrentElement();
     }
@@ -44,8 +48,41 @@ void KmlReader::readMultiGeometry()
     while (m_xml.readNextStartElement()) {
         if (isNamed(m_xml, QLatin1String("LineString")))
             readLineString();
+        else if (isNamed(m_xml, QLatin1String("Track")))
+            readTrack();
         else
             m_xml.skipCurrentElement();
+    }
+}
+
+void KmlReader::readMultiTrack()
+{
+    while (m_xml.readNextStartElement()) {
+        if (isNamed(m_xml, QLatin1String("Track")))
+            readTrack();
+        else
+            m_xml.skipCurrentElement();
+    }
+}
+
+// The track form of recording apps: one "coord" of "longitude latitude altitude" per
+// position, between "when" elements that are not read. Joins the track being read, like
+// a line string.
+void KmlReader::readTrack()
+{
+    m_items.ensureTrackItem();
+    while (m_xml.readNextStartElement()) {
+        if (!isNamed(m_xml, QLatin1String("coord"))) {
+            m_xml.skipCurrentElement();
+            continue;
+        }
+        xmlwalk::readText(m_xml, m_text);
+        const QString coord = m_text.simplified();
+        const QVector<QStringRef> fields = coord.splitRef(QLatin1Char(' '));
+        if (fields.size() < 2)
+            continue;
+        const double elevation = fields.size() > 2 ? fields.at(2).toDouble() : -1.0;
+        m_items.addPoint(fields.at(1).toDouble(), fields.at(0).toDouble(), elevation, QString());
     }
 }
 

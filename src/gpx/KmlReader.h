@@ -8,7 +8,8 @@ class QXmlStreamReader;
 
 // Reads the placemarks of a "kml" root element. The walk descends into "Document"
 // and "Folder" and stops at the first end tag it meets, so of nested or sibling
-// folders only the placemarks up to the end of the first one are read.
+// folders only the placemarks up to the end of the first one are read. Line strings and
+// tracks ("Track", also inside "MultiTrack") make tracks, points waypoints.
 class KmlReader
 {
 public:
@@ -21,6 +22,8 @@ private:
     void readPlacemark();
     void readMultiGeometry();
     void readLineString();
+    void readMultiTrack();
+    void readTrack();
     void readPoint(const QString &name);
     void addLineCoordinates(const QString &text);
 

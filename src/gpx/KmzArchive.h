@@ -1,24 +1,47 @@
 #pragma once
 
 #include <QString>
+#include <QStringList>
 
 #include <cstdint>
+#include <memory>
+#include <vector>
 
-// Unpacks a KMZ (a zip archive) into a folder. The archive is untrusted: an entry whose
-// name is absolute or climbs out of the folder, or whose size is above maxEntrySize,
-// fails, and the first failed entry ends the extraction.
+struct zip;
+
+// The documents of a KMZ, a zip archive: its top-level entries named "*.kml", the
+// suffix in any case as on the systems these archives come from. The archive is
+// untrusted: nothing else of it is unpacked, and a document only within maxEntrySize.
 class KmzArchive
 {
 public:
     static constexpr uint64_t maxEntrySize = uint64_t(512) * 1024 * 1024;
-    // Many entries just under the limit would still fill the disk: the entry that
-    // takes the sum above this fails too.
-    static constexpr uint64_t maxTotalSize = uint64_t(2048) * 1024 * 1024;
 
-    // Entries of size 0 become folders, all others files. Returns false when the archive
-    // can't be opened or an entry failed; what was written before stays in the folder.
-    static bool extract(const QString &archiveFileName, const QString &folder);
+    KmzArchive();
+    ~KmzArchive();
+    KmzArchive(const KmzArchive &) = delete;
+    KmzArchive &operator=(const KmzArchive &) = delete;
 
-    // Whether an entry name stays inside the folder it is unpacked to.
-    static bool isSafeEntryName(const QString &name);
+    // False when the file can't be read as an archive.
+    bool open(const QString &fileName);
+    // The documents' entry names, sorted by name ignoring case.
+    QStringList documents() const;
+    // Writes the document at that place of documents() to a file; false when it is above
+    // the size limit, damaged or can't be written.
+    bool extractDocument(int document, const QString &targetFile) const;
+
+private:
+    struct Closer
+    {
+        void operator()(struct zip *archive) const;
+    };
+    struct Document
+    {
+        QString name;
+        uint64_t index;
+        uint64_t size;
+    };
+
+    std::unique_ptr<struct zip, Closer> m_archive;
+    std::vector<Document> m_documents;
 };

@@ -13,34 +13,38 @@ constexpr double unset = std::numeric_limits<double>::max();
 bool TcxReader::read()
 {
     while (m_xml.readNextStartElement()) {
-        if (isNamed(m_xml, QLatin1String("Activities")))
-            readActivities();
-        else if (isNamed(m_xml, QLatin1String("Courses")))
-            readCourses();
-        else
+        if (isNamed(m_xml, QLatin1String("Activities"))) {
+            if (readFirst(QLatin1String("Activity")))
+                break;
+        } else if (isNamed(m_xml, QLatin1String("Courses"))) {
+            if (readFirst(QLatin1String("Course")))
+                break;
+        } else {
             m_xml.skipCurrentElement();
+        }
     }
     return true;
 }
 
-void TcxReader::readActivities()
+bool TcxReader::readFirst(QLatin1String name)
 {
     while (m_xml.readNextStartElement()) {
-        if (isNamed(m_xml, QLatin1String("Activity")) || isNamed(m_xml, QLatin1String("Lap")))
-            continue;
-        if (isNamed(m_xml, QLatin1String("Track")))
-            readTrack();
-        else
-            m_xml.skipCurrentElement();
+        if (isNamed(m_xml, name)) {
+            readTracks(true);
+            return true;
+        }
+        m_xml.skipCurrentElement();
     }
+    return false;
 }
 
-void TcxReader::readCourses()
+// An activity keeps its tracks in laps, a course directly.
+void TcxReader::readTracks(bool withLaps)
 {
     while (m_xml.readNextStartElement()) {
-        if (isNamed(m_xml, QLatin1String("Course")))
-            continue;
-        if (isNamed(m_xml, QLatin1String("Track")))
+        if (withLaps && isNamed(m_xml, QLatin1String("Lap")))
+            readTracks(false);
+        else if (isNamed(m_xml, QLatin1String("Track")))
             readTrack();
         else
             m_xml.skipCurrentElement();

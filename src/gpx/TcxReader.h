@@ -6,9 +6,8 @@
 
 class QXmlStreamReader;
 
-// Reads the trackpoints of a "TrainingCenterDatabase" root element. Like the KML walk
-// it descends into "Activity", "Lap" and "Course" and stops at the first end tag, so
-// only the first lap of the first activity (or the first course) is read.
+// Reads the trackpoints of a "TrainingCenterDatabase" root element: those of the first
+// activity, all its laps in order, or of the first course, as one track.
 class TcxReader
 {
 public:
@@ -18,8 +17,10 @@ public:
     bool read();
 
 private:
-    void readActivities();
-    void readCourses();
+    // Reads the first child of that name of the current element and its tracks; false
+    // when there is none.
+    bool readFirst(QLatin1String name);
+    void readTracks(bool withLaps);
     void readTrack();
     void readTrackpoint();
 

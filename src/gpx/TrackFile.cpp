@@ -6,7 +6,6 @@
 #include "gpx/TcxReader.h"
 #include "gpx/TrkReader.h"
 
-#include <QDir>
 #include <QFile>
 #include <QFileInfo>
 #include <QTemporaryDir>
@@ -64,26 +63,26 @@ bool TrackFile::readTrk(QIODevice *device)
     return TrkReader(m_items).read(*device);
 }
 
-// Of several documents in one archive only the first is read: the folder is removed
-// after it, so the others fail to open and the last result is the answer.
+// Of several documents in one archive only the first is read, and the answer is false,
+// as the others can't be opened.
 bool TrackFile::loadKmz(const QString &fileName)
 {
+    KmzArchive archive;
+    if (!archive.open(fileName))
+        return false;
+    const QStringList documents = archive.documents();
+    if (documents.isEmpty())
+        return false;
     QTemporaryDir folder;
     if (!folder.isValid())
         return false;
-    if (!KmzArchive::extract(fileName, folder.path()))
+    const QString document = folder.filePath(QStringLiteral("doc.kml"));
+    if (!archive.extractDocument(0, document))
         return false;
-
-    QStringList baseNames;
-    const QFileInfoList documents =
-        QDir(folder.path()).entryInfoList({QStringLiteral("*.kml")}, QDir::Files | QDir::NoDotAndDotDot);
-    for (const QFileInfo &document : documents)
-        baseNames.append(document.completeBaseName());
-
-    bool result = false;
-    for (const QString &baseName : baseNames) {
-        result = load(QStringLiteral("%1/%2.kml").arg(folder.path(), baseName));
-        folder.remove();
+    bool result = load(document);
+    for (int i = 1; i < documents.size(); ++i) {
+        logTrace(0, QStringLiteral("File open error: %s"), QStringLiteral("%1 is not read").arg(documents.at(i)));
+        result = false;
     }
     return result;
 }

@@ -1,8 +1,9 @@
 #include "gpx/TrkReader.h"
 
+#include "gpx/LineReader.h"
+#include "platform/TextDecoding.h"
+
 #include <QIODevice>
-#include <QRegExp>
-#include <QTextCodec>
 #include <QVector>
 
 #include <limits>
@@ -10,29 +11,20 @@
 namespace {
 constexpr double unset = std::numeric_limits<double>::max();
 constexpr QChar degreeSign(0x00BA);
-}
-
-QString TrkReader::decode(const QByteArray &bytes)
-{
-    if (QTextCodec *unicode = QTextCodec::codecForUtfText(bytes, nullptr))
-        return unicode->toUnicode(bytes);
-    QTextCodec::ConverterState state;
-    const QString text = QTextCodec::codecForMib(106)->toUnicode(bytes.constData(), bytes.size(), &state);
-    if (state.invalidChars == 0 && state.remainingChars == 0)
-        return text;
-    if (QTextCodec *singleByte = QTextCodec::codecForName("windows-1252"))
-        return singleByte->toUnicode(bytes);
-    return QString::fromLatin1(bytes);
+// A point line is some 80 characters long.
+constexpr int maxLineLength = 64 * 1024;
 }
 
 bool TrkReader::read(QIODevice &device)
 {
-    const QString text = decode(device.readAll());
-    static const QRegExp lineEnd(QStringLiteral("\n|\r\n|\r"));
-    const QVector<QStringRef> lines = text.splitRef(lineEnd, Qt::KeepEmptyParts);
-    for (const QStringRef &line : lines) {
-        if (!line.isEmpty())
-            readLine(line);
+    LineReader lines(device, maxLineLength);
+    QByteArray bytes;
+    while (lines.next(bytes)) {
+        if (bytes.isEmpty())
+            continue;
+        // Decided line by line: one damaged line doesn't turn the rest into the wrong code page.
+        const QString line = textdecoding::decodeUnmarked(bytes.constData(), bytes.size());
+        readLine(QStringRef(&line));
     }
     return true;
 }

@@ -12,12 +12,10 @@ class TrkReader
 public:
     explicit TrkReader(TrackItemList &items) : m_items(items) {}
 
-    // Reads the rest of the device. Lines that aren't track points are skipped.
+    // Reads the rest of the device line by line. Lines that aren't track points are
+    // skipped. A byte-order mark decides the encoding where there is one; else each line
+    // is UTF-8 when valid, else the code page 1252 these files are written in.
     bool read(QIODevice &device);
-
-    // The text of a file: a byte-order mark decides when there is one, then UTF-8 when
-    // the bytes are valid UTF-8, else the single-byte code page 1252 these files are written in.
-    static QString decode(const QByteArray &bytes);
 
 private:
     void readLine(const QStringRef &line);

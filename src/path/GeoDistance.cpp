@@ -2,6 +2,7 @@
 
 #include <QtMath>
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
 
@@ -35,6 +36,20 @@ double GeoDistanceFrom::term(double lat, double lon) const
     double hLon = std::sin(qDegreesToRadians(lon - m_lon) / 2.0);
     hLon *= hLon;
     return hLat + m_cosLat * std::cos(qDegreesToRadians(lat)) * hLon;
+}
+
+double GeoDistanceFrom::termAtLeast(double lat, double lon) const
+{
+    if (!m_valid || !validCoordinate(lat, lon))
+        return 0.0;
+    // sin(t) >= 2t / pi on [0, pi/2], and cos moves by at most the angle it is moved by.
+    const double dLat = std::fabs(qDegreesToRadians(lat - m_lat));
+    double dLon = std::fabs(qDegreesToRadians(lon - m_lon));
+    if (dLon > M_PI)
+        dLon = 2 * M_PI - dLon;
+    const double cosLat = std::max(0.0, m_cosLat - dLat);
+    const double bound = (dLat * dLat + m_cosLat * cosLat * dLon * dLon) / (M_PI * M_PI);
+    return bound * (1 - 1e-9); // room for rounding
 }
 
 double GeoDistanceFrom::termToMetres(double term)

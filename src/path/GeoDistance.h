@@ -13,6 +13,9 @@ public:
     bool valid() const { return m_valid; }
     // The haversine term to (lat, lon); 0 when either point is invalid.
     double term(double lat, double lon) const;
+    // A value never above term(lat, lon), made without trigonometry, to pass over points
+    // that can't be nearer than one already found.
+    double termAtLeast(double lat, double lon) const;
     static double termToMetres(double term);
     static double metresToTerm(double metres);
 

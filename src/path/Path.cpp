@@ -126,16 +126,14 @@ void Path::insertKeyPoint(uint32_t afterId, const KeyPoint &point, bool doUpdate
             first = size_t(atSample) + 1;
         }
         curvePoints[first].correspondingKeyPoint = point.id;
-        std::vector<CurvePoint> samples{curvePoints[first]};
-        for (size_t i = first + 1; i < curvePoints.size(); ++i) {
-            if (curvePoints[i].correspondingKeyPoint != 0) {
-                if (samples.size() < 2)
-                    samples.push_back(curvePoints[i]);
-                break;
-            }
-            samples.push_back(curvePoints[i]);
-        }
-        segment.setCurvePoints(std::move(samples));
+        // The leg runs up to the next key point's sample, which ends it only when it would
+        // hold a single sample without.
+        size_t end = first + 1;
+        while (end < curvePoints.size() && curvePoints[end].correspondingKeyPoint == 0)
+            ++end;
+        if (end < curvePoints.size() && end == first + 1)
+            ++end;
+        segment.setCurvePoints(std::vector<CurvePoint>(curvePoints.begin() + long(first), curvePoints.begin() + long(end)));
     }
 
     KeyPoint inserted = point;
@@ -706,13 +704,24 @@ void Path::rebuildSegmentSamples(int segmentIndex)
 
 int Path::nearestCurvePoint(double x, double y, size_t from, size_t to) const
 {
+    to = std::min(to, curvePoints.size());
     const GeoDistanceFrom origin(y, x);
+    // A first guess from a few samples lets the full pass skip, by a bound that needs no
+    // trigonometry, the samples that can't come nearer: long tracks are searched often.
+    constexpr size_t guessStride = 64;
+    double bound = std::numeric_limits<double>::infinity();
+    for (size_t i = from; i < to; i += guessStride)
+        bound = std::min(bound, origin.term(curvePoints[i].y, curvePoints[i].x));
     double best = std::numeric_limits<double>::infinity();
     int nearest = -1;
-    for (size_t i = from; i < to && i < curvePoints.size(); ++i) {
-        const double d = origin.term(curvePoints[i].y, curvePoints[i].x);
+    for (size_t i = from; i < to; ++i) {
+        const CurvePoint &p = curvePoints[i];
+        if (origin.termAtLeast(p.y, p.x) > bound)
+            continue;
+        const double d = origin.term(p.y, p.x);
         if (d < best) {
             best = d;
+            bound = std::min(bound, d);
             nearest = int(i);
         }
     }

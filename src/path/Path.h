@@ -83,6 +83,8 @@ public:
     int keyPointIndex(uint32_t id) const;
     int mediaPointIndex(uint32_t id) const;
     int curvePointIndexNaming(uint32_t keyPointId) const;
+    // The sample in [from, to) nearest to (x, y); the first of equally near ones. -1 when none.
+    int nearestCurvePoint(double x, double y, size_t from, size_t to) const;
     PathSegment *segmentForKeyPoint(uint32_t keyPointId);
     PathSegment *segmentById(uint32_t segmentId);
     PathSegment *nextSegment(uint32_t &segmentId);
@@ -123,6 +125,5 @@ private:
     void insertSampleCopy(size_t index);
     void renewIdsFrom(size_t index);
     void rebuildSegmentSamples(int segmentIndex);
-    int nearestCurvePoint(double x, double y, size_t from, size_t to) const;
     MediaPoint *mediaPointById(uint32_t id);
 };

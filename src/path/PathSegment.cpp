@@ -81,8 +81,11 @@ void PathSegment::setCurvePoints(std::vector<CurvePoint> &&points)
 
 void PathSegment::resize(size_t n)
 {
-    if (n < curvePoints.size())
-        curvePoints.resize(n);
+    if (n >= curvePoints.size())
+        return;
+    curvePoints.resize(n);
+    // A track's leg cut short would otherwise keep the room of all the track behind it.
+    curvePoints.shrink_to_fit();
 }
 
 void PathSegment::assign(const PathSegment &other, bool copyId)

@@ -68,7 +68,10 @@ private slots:
         QVERIFY(writeItemIni(m_dir.filePath(QStringLiteral("extra/wp/")), QStringLiteral("pin"), "type=svg\n"));
 
         const QString maps = m_root + QStringLiteral("maps/");
-        QVERIFY(writeFile(maps + QStringLiteral("Translation_EN.ini"), "[world]\nname=World, political\n"));
+        // Made on another system: a translation in its code page and an ini suffix in capitals.
+        QVERIFY(writeFile(maps + QStringLiteral("Translation_EN.ini"),
+                          "[world]\nname=World, political\n[Coast]\nname=C\xF4te \x96 Riviera\n"));
+        QVERIFY(writeFile(maps + QStringLiteral("informations/Coast.INI"), "[main]\ntype=jpg\norigins=map.c\xF4te\n"));
         QVERIFY(writeItemIni(maps, QStringLiteral("world"),
                              "type=jpg\nitem_main_category=world_shop\norigins=map.world\nbackground=#A0B0C0\nwidthWeight=1.25\n"));
         QVERIFY(writeItemIni(maps, QStringLiteral("alps"), "type=jpg\norigins=map.alps\n"));
@@ -204,11 +207,14 @@ private slots:
         QCOMPARE(noType->groupIndex, 0);
 
         const std::vector<MapItem> maps = catalogue.maps();
-        QCOMPARE(int(maps.size()), 2);
+        QCOMPARE(int(maps.size()), 3);
         QCOMPARE(maps.at(0).name, QString()); // "alps" has no translation
         QCOMPARE(maps.at(0).mainCategory, QStringLiteral("europe_shop"));
         QCOMPARE(maps.at(0).elementId, QStringLiteral("map.alps"));
-        const MapItem &world = maps.at(1);
+        QCOMPARE(maps.at(1).name, QStringLiteral("Côte – Riviera"));
+        QCOMPARE(maps.at(1).elementId, QStringLiteral("map.côte"));
+        QCOMPARE(maps.at(1).sourceFile, m_root + QStringLiteral("maps/Coast.jpg"));
+        const MapItem &world = maps.at(2);
         QCOMPARE(world.name, QStringLiteral("World, political"));
         QCOMPARE(world.mainCategory, QStringLiteral("world_shop"));
         QCOMPARE(world.elementId, QStringLiteral("map.world"));

@@ -120,10 +120,11 @@ private slots:
             QCOMPARE(value(file, QStringLiteral("grüße"), QStringLiteral("NAME")), QStringLiteral("Fähre ✈"));
             QCOMPARE(value(file, QStringLiteral("Grüße"), QStringLiteral("other")), QStringLiteral("東京"));
         }
-        // Bytes that are no UTF-8 are taken as Latin-1.
-        const QString latin = path(QStringLiteral("latin1.ini"));
-        QVERIFY(writeFile(latin, "[main]\nname=F\xE4hre\n"));
-        QCOMPARE(value(latin, QStringLiteral("main"), QStringLiteral("name")), QStringLiteral("Fähre"));
+        // Bytes that are no UTF-8 are taken as Windows-1252, in both formats.
+        const QString windows = path(QStringLiteral("cp1252.ini"));
+        QVERIFY(writeFile(windows, "[main]\nname=F\xE4hre \x80\n"));
+        QCOMPARE(value(windows, QStringLiteral("main"), QStringLiteral("name")), QStringLiteral("Fähre €"));
+        QCOMPARE(readIniValue(windows, QStringLiteral("main"), QStringLiteral("name"), false), QStringLiteral("Fähre €"));
     }
 
     void damagedFilesGiveDefaults()
@@ -234,10 +235,12 @@ private slots:
     {
         const QString root = path(QStringLiteral("folders/"));
         for (const char *name : {"informations/b.ini", "informations/A.ini", "informations/c.INI", "informations/x.txt",
-                                 "informations/z.v2.ini", "sub1/deep/f", "sub2/f"})
+                                 "informations/z.v2.ini", "informations/a-b.ini", "sub1/deep/f", "sub2/f"})
             QVERIFY(writeFile(root + QString::fromLatin1(name), "x"));
-        QCOMPARE(listInformationStems(root),
-                 QStringList({QStringLiteral("A"), QStringLiteral("b"), QStringLiteral("z.v2")}));
+        // Sorted by stem: "a-b" after "A" although "-" comes before ".".
+        QCOMPARE(listInformationFiles(root),
+                 QStringList({QStringLiteral("A.ini"), QStringLiteral("a-b.ini"), QStringLiteral("b.ini"),
+                              QStringLiteral("c.INI"), QStringLiteral("z.v2.ini")}));
         QCOMPARE(listFileStems(root + QStringLiteral("informations"), QStringLiteral("*.txt")), QStringList{QStringLiteral("x")});
         QVERIFY(listFileStems(root + QStringLiteral("nothing"), QStringLiteral("*.ini")).isEmpty());
         QStringList flat = listSubfolders(root, false);

@@ -8,6 +8,17 @@
 #include <QTemporaryDir>
 #include <QTest>
 
+#include <sys/resource.h>
+
+namespace {
+long peakRssKiB()
+{
+    rusage usage{};
+    getrusage(RUSAGE_SELF, &usage);
+    return usage.ru_maxrss;
+}
+}
+
 class TestTrackFile : public QObject
 {
     Q_OBJECT
@@ -279,30 +290,43 @@ private slots:
         QVERIFY(waypoints.points[1].name.isEmpty()); // its name came after the Point
         QVERIFY(!waypoints.points[1].hasAltitude);
 
-        // Both line strings join one track; the tab-joined tuple reads as one damaged part,
-        // a two-field tuple has no elevation, the second folder is never reached.
+        // Line strings and tracks join one track; the tab-joined tuple reads as one damaged
+        // part, a two-field tuple has no elevation, the second folder is never reached.
         const TrackItem &track = file.items()[1];
         QCOMPARE(track.type, int32_t(TrackItem::Track));
         QCOMPARE(file.selectItem(), 1);
         QVector<double> longitudes;
         for (const TrackPoint &p : track.points)
             longitudes << p.longitude;
-        QCOMPARE(longitudes, (QVector<double>{7.1, 7.3, 7.4, 7.5, 0.0, 7.7}));
+        QCOMPARE(longitudes, (QVector<double>{7.1, 7.3, 7.4, 7.5, 0.0, 1.0, 7.7}));
         QVERIFY(!track.points[2].hasAltitude);
         QCOMPARE(track.points[3].altitude, 30.0);
         QCOMPARE(track.points[4].latitude, 46.6);
         QCOMPARE(track.bounds.right, 7.7);
+        QCOMPARE(track.points[5].altitude, 3.0);
 
-        // A document with only unknown geometry reads as nothing, which fails.
-        QVERIFY(!file.load(write("gx.kml", "<kml><Document><Placemark><gx:Track xmlns:gx=\"g\"><gx:coord>1 2 3</gx:coord>"
-                                           "</gx:Track></Placemark></Document></kml>")));
+        // A phone tracker's file: tracks in a multi-track, "when" and "coord" in turn.
+        QVERIFY(file.load(write("gx.kml", "<kml xmlns:gx=\"g\"><Document><Placemark><gx:MultiTrack>"
+                                          "<gx:Track><when>t</when><when>t</when><gx:coord>8.5 47.25 400.5</gx:coord>"
+                                          "<gx:coord>\n 8.6\t47.3 </gx:coord></gx:Track><gx:Track><gx:coord>8.7 47.35 410"
+                                          "</gx:coord><gx:coord>bad</gx:coord><gx:angles>0 0 0</gx:angles></gx:Track>"
+                                          "</gx:MultiTrack></Placemark></Document></kml>")));
+        QCOMPARE(int(file.items().size()), 1);
+        const QVector<TrackPoint> &gx = file.items()[0].points;
+        QCOMPARE(gx.size(), 3);
+        QCOMPARE(gx[0].latitude, 47.25);
+        QCOMPARE(gx[0].altitude, 400.5);
+        QCOMPARE(gx[1].longitude, 8.6);
+        QVERIFY(!gx[1].hasAltitude);
+        QCOMPARE(gx[2].longitude, 8.7);
+
         // Placemarks right under the root are read too.
         QVERIFY(file.load(write("flat.kml", "<kml><Placemark><Point><coordinates>1,2,3</coordinates></Point></Placemark>"
                                             "<Placemark><Point><coordinates>4,5</coordinates></Point></Placemark></kml>")));
         QCOMPARE(file.items()[0].points.size(), 2);
     }
 
-    void tcxFirstLapOnly()
+    void tcxLapsOfTheFirstActivity()
     {
         const QByteArray tcx =
             "\xEF\xBB\xBF<?xml version=\"1.0\" encoding=\"UTF-8\"?>\r\n"
@@ -317,16 +341,26 @@ private slots:
             "<Trackpoint><Position><LongitudeDegrees>7.6</LongitudeDegrees><LatitudeDegrees>46.6</LatitudeDegrees>"
             "</Position></Trackpoint>\r\n"
             "</Track></Lap>\r\n"
-            "<Lap><Track><Trackpoint><Position><LatitudeDegrees>1</LatitudeDegrees><LongitudeDegrees>1</LongitudeDegrees>"
-            "</Position></Trackpoint></Track></Lap>\r\n"
-            "</Activity></Activities></TrainingCenterDatabase>\r\n";
+            "<Lap><Track><Trackpoint><Position><LatitudeDegrees>46.7</LatitudeDegrees><LongitudeDegrees>7.7"
+            "</LongitudeDegrees></Position></Trackpoint></Track>"
+            "<Track><Trackpoint><Position><LatitudeDegrees>46.8</LatitudeDegrees><LongitudeDegrees>7.8"
+            "</LongitudeDegrees></Position></Trackpoint></Track></Lap>\r\n"
+            "<Lap><Track/></Lap><Lap><Track><Trackpoint><Position><LatitudeDegrees>46.9</LatitudeDegrees>"
+            "<LongitudeDegrees>7.9</LongitudeDegrees></Position></Trackpoint></Track></Lap>\r\n"
+            "</Activity>\r\n"
+            "<Activity><Lap><Track><Trackpoint><Position><LatitudeDegrees>1</LatitudeDegrees><LongitudeDegrees>1"
+            "</LongitudeDegrees></Position></Trackpoint></Track></Lap></Activity>"
+            "</Activities></TrainingCenterDatabase>\r\n";
         TrackFile file;
         QVERIFY(file.load(write("laps.tcx", tcx)));
         QCOMPARE(int(file.items().size()), 1);
         const QVector<TrackPoint> &p = file.items()[0].points;
-        QCOMPARE(p.size(), 2); // the trackpoint without position is dropped
+        // The trackpoint without position is dropped, the second activity not read.
+        QVector<double> latitudes;
+        for (const TrackPoint &point : p)
+            latitudes << point.latitude;
+        QCOMPARE(latitudes, (QVector<double>{46.5, 46.6, 46.7, 46.8, 46.9}));
         QCOMPARE(p[0].altitude, 600.0);
-        QCOMPARE(p[1].longitude, 7.6);
         QVERIFY(p[1].hasAltitude); // no AltitudeMeters still gives altitude 0
         QCOMPARE(p[1].altitude, 0.0);
 
@@ -372,6 +406,17 @@ private slots:
         QCOMPARE(file.items()[0].points.size(), 3);
         QVERIFY(file.load(write("old.trk", QByteArray(latin1).replace("\r\n", "\r"))));
         QCOMPARE(file.items()[0].points.size(), 3);
+
+        // Floods of line ends and an overlong line are read in little memory; the overlong
+        // line is skipped whole and the point after it still read.
+        const QString flood = write("flood.trk", QByteArray(8 << 20, '\n') + QByteArray(8 << 20, '\r') +
+                                                     "T  A 10\xBAN 20\xBA" "E " + QByteArray(100000, 'x') + "\r\n" +
+                                                     latin1.mid(latin1.indexOf("T  A 47.27")));
+        const long peakBefore = peakRssKiB();
+        QVERIFY(file.load(flood));
+        QCOMPARE(file.items()[0].points.size(), 2);
+        QCOMPARE(file.items()[0].points[0].latitude, 47.27);
+        QVERIFY2(peakRssKiB() - peakBefore < 16 * 1024, qPrintable(QString::number(peakRssKiB() - peakBefore)));
 
         // Not a trk by its suffix: read as XML and refused.
         QVERIFY(!file.load(write("route.trk.txt", latin1)));

@@ -264,6 +264,60 @@ private slots:
         QCOMPARE(untouched.keyPoints.size(), before);
     }
 
+    void waypointsOfATrackBecomeKeyPoints_data()
+    {
+        QTest::addColumn<uint32_t>("aliasing");
+        QTest::addColumn<double>("tolerance"); // metres between a waypoint and its key point
+        QTest::newRow("every point a sample") << 0u << 0.0;
+        QTest::newRow("thinned") << 2u << 5.0;
+    }
+
+    void waypointsOfATrackBecomeKeyPoints()
+    {
+        QFETCH(uint32_t, aliasing);
+        QFETCH(double, tolerance);
+        auto at = [](int i) { return QPointF(11.0 + i * 0.0004, 48.0 + i * 0.0003); };
+        auto wpt = [](QPointF p, const QByteArray &inner) {
+            return "<wpt lat=\"" + QByteArray::number(p.y(), 'f', 7) + "\" lon=\"" + QByteArray::number(p.x(), 'f', 7) +
+                   "\">" + inner + "</wpt>\n";
+        };
+        // As a device writes them: waypoints after the track, one beside it, one on its end,
+        // and a nameless one on a named one's place.
+        QByteArray gpx = gpxTrack(300);
+        gpx.insert(gpx.indexOf("</gpx>"), wpt(at(100) + QPointF(0.00001, 0), "<name>Bridge</name>") +
+                                              wpt(at(299), "<name>Summit</name>") +
+                                              wpt(at(200), "<name>Hut</name><ele>2</ele>") + wpt(at(200), QByteArray()));
+        Path path;
+        QVERIFY(TrackImport::read(write(QStringLiteral("waypoints.gpx"), gpx), path, aliasing));
+
+        const QStringList expected{QString(), QStringLiteral("Bridge"), QStringLiteral("Hut"), QStringLiteral("Summit")};
+        const QVector<QPointF> places{at(0), at(100), at(200), at(299)};
+        QStringList titles;
+        for (const KeyPoint &k : path.keyPoints)
+            titles << k.title();
+        QCOMPARE(titles, expected);
+        QCOMPARE(path.pathSegments.size(), path.keyPoints.size());
+        int previous = -1;
+        for (int k = 0; k < path.keyPoints.size(); ++k) {
+            const KeyPoint &key = path.keyPoints[size_t(k)];
+            const int sample = path.curvePointIndexNaming(key.id);
+            QVERIFY(sample > previous); // in the order of the curve
+            previous = sample;
+            const CurvePoint &c = path.curvePoints[size_t(sample)];
+            QCOMPARE(QPointF(key.x, key.y), QPointF(c.x, c.y));
+            QVERIFY2(geoDistance(c.y, c.x, places[k].y(), places[k].x()) <= tolerance,
+                     qPrintable(key.title() + QString::number(geoDistance(c.y, c.x, places[k].y(), places[k].x()))));
+            if (k + 1 < titles.size()) // the last key point's segment has no samples
+                QCOMPARE(path.pathSegments[size_t(k)].curvePoints.front().id, c.id);
+        }
+        QCOMPARE(previous, int(path.curvePoints.size()) - 1);
+
+        // The ends of the track stay locked, the waypoints are ordinary key points of it.
+        QVERIFY(!path.deleteKeyPoint(path.keyPoints.front().id));
+        QVERIFY(path.deleteKeyPoint(path.keyPoints[1].id));
+        QCOMPARE(path.keyPoints.size(), size_t(3));
+    }
+
     void trackCommand()
     {
         const QString file = write(QStringLiteral("cli.gpx"), gpxTrack(300));

@@ -6,8 +6,10 @@
 #include <QGeoCoordinate>
 #include <QTest>
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
+#include <random>
 
 namespace {
 
@@ -315,6 +317,50 @@ private slots:
         const BasePoint *onCurve = path.hitTest(0.5, 0.5, 2000, smallest, true);
         QVERIFY(onCurve && dynamic_cast<const CurvePoint *>(onCurve));
         QVERIFY(!path.hitTest(0.5, 0.5, 2000, smallest, false));
+    }
+
+    void nearestSampleOfAWalkOverAll()
+    {
+        // Samples over the globe, on both sides of the antimeridian, near a pole, and some
+        // on the same place: the search finds what a walk over every sample finds, the
+        // first of equally near ones.
+        Path path;
+        std::mt19937 random(7);
+        std::uniform_real_distribution<double> anyLon(-180, 180), anyLat(-90, 90), near(-0.5, 0.5);
+        auto wrapped = [](double lon) { return lon > 180 ? lon - 360 : lon < -180 ? lon + 360 : lon; };
+        for (int i = 0; i < 3000; ++i) {
+            if (i % 3 == 0)
+                path.addCurvePoint(anyLon(random), anyLat(random), 0);
+            else if (i % 3 == 1)
+                path.addCurvePoint(wrapped(179.9 + near(random)), 10 + near(random), 0);
+            else
+                path.addCurvePoint(anyLon(random), 89.6 + near(random) * 0.8, 0);
+        }
+        for (size_t i = 2000; i < 2100; ++i) {
+            path.curvePoints[i].x = path.curvePoints[i - 1500].x;
+            path.curvePoints[i].y = path.curvePoints[i - 1500].y;
+        }
+        auto walk = [&](double x, double y, size_t from, size_t to) {
+            const GeoDistanceFrom origin(y, x);
+            int nearest = -1;
+            double best = std::numeric_limits<double>::infinity();
+            for (size_t i = from; i < to; ++i) {
+                const double d = origin.term(path.curvePoints[i].y, path.curvePoints[i].x);
+                if (d < best) {
+                    best = d;
+                    nearest = int(i);
+                }
+            }
+            return nearest;
+        };
+        for (int q = 0; q < 300; ++q) {
+            const CurvePoint &on = path.curvePoints[size_t(q * 7 + 1)];
+            const double x = q % 2 ? anyLon(random) : wrapped(on.x + near(random) * 0.01);
+            const double y = q % 2 ? anyLat(random) : std::max(-90.0, std::min(90.0, on.y + near(random) * 0.01));
+            QCOMPARE(path.nearestCurvePoint(x, y, 0, 3000), walk(x, y, 0, 3000));
+            QCOMPARE(path.nearestCurvePoint(x, y, 700, 1100), walk(x, y, 700, 1100));
+        }
+        QCOMPARE(path.nearestCurvePoint(0, 0, 5, 5), -1);
     }
 
     void distanceMatchesQt()
