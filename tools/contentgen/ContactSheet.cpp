@@ -9,9 +9,7 @@
 #include <QFontMetrics>
 #include <QPainter>
 
-#include <gif_lib.h>
-
-#include <cstring>
+#include <algorithm>
 #include <vector>
 
 namespace {
@@ -64,6 +62,8 @@ public:
 
     void section(const QString &heading, const std::vector<Tile> &tiles, QSize cell, bool keepBackground = false)
     {
+        if (tiles.empty())
+            return;
         QFont font(QStringLiteral("DejaVu Sans"));
         font.setPixelSize(17);
         font.setBold(true);
@@ -112,33 +112,15 @@ private:
     int m_y = 0;
 };
 
-// Down to 256 colours with the GIF library's quantiser; PNG keeps the palette.
-QImage quantised(const QImage &image)
+// Six bits a channel: no visible change on these pictures, and a third smaller as PNG.
+QImage posterised(const QImage &image)
 {
-    const QImage rgb = image.convertToFormat(QImage::Format_RGB32);
-    const unsigned count = unsigned(rgb.width()) * unsigned(rgb.height());
-    std::vector<GifByteType> r(count), g(count), b(count), indices(count);
-    for (int y = 0; y < rgb.height(); ++y) {
-        const auto *row = reinterpret_cast<const QRgb *>(rgb.constScanLine(y));
-        for (int x = 0; x < rgb.width(); ++x) {
-            const size_t i = size_t(y) * size_t(rgb.width()) + size_t(x);
-            r[i] = GifByteType(qRed(row[x]));
-            g[i] = GifByteType(qGreen(row[x]));
-            b[i] = GifByteType(qBlue(row[x]));
-        }
+    QImage out = image.convertToFormat(QImage::Format_RGB888);
+    for (int y = 0; y < out.height(); ++y) {
+        uchar *row = out.scanLine(y);
+        for (int x = 0; x < out.width() * 3; ++x)
+            row[x] = uchar((row[x] & 0xFC) | (row[x] >> 6));
     }
-    int size = 256;
-    GifColorType palette[256];
-    if (GifQuantizeBuffer(unsigned(rgb.width()), unsigned(rgb.height()), &size, r.data(), g.data(), b.data(),
-                          indices.data(), palette) == GIF_ERROR)
-        return image;
-    QImage out(rgb.size(), QImage::Format_Indexed8);
-    QVector<QRgb> table;
-    for (int i = 0; i < size; ++i)
-        table << qRgb(palette[i].Red, palette[i].Green, palette[i].Blue);
-    out.setColorTable(table);
-    for (int y = 0; y < rgb.height(); ++y)
-        std::memcpy(out.scanLine(y), indices.data() + size_t(y) * size_t(rgb.width()), size_t(rgb.width()));
     return out;
 }
 
@@ -148,29 +130,33 @@ bool writeContactSheet(const QString &imageRoot, const QString &pngPath)
 {
     const QString root = imageRoot.endsWith(QLatin1Char('/')) ? imageRoot : imageRoot + QLatin1Char('/');
     Sheet sheet;
-    std::vector<Tile> avatars = tilesOf(files(root + QStringLiteral("avatars/Icons"), {QStringLiteral("*.png"), QStringLiteral("*.gif")}));
+    // Flat avatars by their thumbnails, perspective ones by their first frame, as the lists show them.
+    const QStringList models = QDir(root + QStringLiteral("avatars/ZK3D")).entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name);
+    QStringList avatarFiles = files(root + QStringLiteral("avatars/Icons"), {QStringLiteral("*.png"), QStringLiteral("*.gif")});
+    for (const QString &model : models)
+        avatarFiles << QStringLiteral("%1avatars/ZK3D/%2/%2_1.png").arg(root, model);
+    std::vector<Tile> avatars = tilesOf(avatarFiles);
+    for (size_t i = avatars.size() - size_t(models.size()); i < avatars.size(); ++i)
+        avatars[i].label.chop(2);
+    std::sort(avatars.begin(), avatars.end(), [](const Tile &a, const Tile &b) { return a.label.compare(b.label, Qt::CaseInsensitive) < 0; });
     sheet.section(QStringLiteral("Avatars"), avatars, QSize(96, 96));
 
     std::vector<Tile> turns;
-    for (const QFileInfo &model : QDir(root + QStringLiteral("avatars/ZK3D")).entryInfoList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Name)) {
-        const int frames = int(QDir(model.filePath()).entryList({QStringLiteral("*.png")}, QDir::Files).size());
+    for (const QString &model : models) {
+        const QString folder = root + QStringLiteral("avatars/ZK3D/") + model;
+        const int frames = int(QDir(folder).entryList({QStringLiteral("*.png")}, QDir::Files).size());
         for (int k = 0; k < 12 && frames > 0; ++k) {
             const int frame = 1 + k * frames / 12;
-            const QString path = QStringLiteral("%1/%2_%3.png").arg(model.filePath(), model.fileName()).arg(frame);
-            turns.push_back({QImage(path), QStringLiteral("%1_%2").arg(model.fileName()).arg(frame)});
+            const QString path = QStringLiteral("%1/%2_%3.png").arg(folder, model).arg(frame);
+            turns.push_back({QImage(path), QStringLiteral("%1_%2").arg(model).arg(frame)});
         }
     }
-    sheet.section(QStringLiteral("Perspective avatar, one frame in six"), turns, QSize(88, 88));
+    sheet.section(QStringLiteral("Perspective avatar, every sixth frame"), turns, QSize(86, 86));
     sheet.section(QStringLiteral("Waypoint symbols"), tilesOf(files(root + QStringLiteral("waypoints"), {QStringLiteral("*.png")})), QSize(80, 80));
     sheet.section(QStringLiteral("Masks"), tilesOf(files(root + QStringLiteral("masks/Icons"), {QStringLiteral("*.png")})), QSize(112, 63));
-    sheet.section(QStringLiteral("Maps"), tilesOf(files(root + QStringLiteral("maps/Icons"), {QStringLiteral("*.jpg"), QStringLiteral("*.png")})), QSize(256, 128));
+    sheet.section(QStringLiteral("Maps"), tilesOf(files(root + QStringLiteral("maps/Icons"), {QStringLiteral("*.jpg"), QStringLiteral("*.png")})), QSize(200, 100));
     sheet.section(QStringLiteral("Altitude themes"), tilesOf(files(root + QStringLiteral("altitudepresets/Icons"), {QStringLiteral("*.png")})), QSize(128, 80), true);
-    sheet.section(QStringLiteral("Splash"), tilesOf({root + QStringLiteral("splash/splash.png")}), QSize(320, 200));
+    sheet.section(QStringLiteral("Splash"), tilesOf({root + QStringLiteral("splash/splash.png")}), QSize(256, 160));
 
-    QImage image = sheet.finish();
-    if (!raster::save(image, pngPath))
-        return false;
-    if (QFileInfo(pngPath).size() > 280 * 1024)
-        return raster::save(quantised(image), pngPath);
-    return true;
+    return raster::save(posterised(sheet.finish()), pngPath);
 }

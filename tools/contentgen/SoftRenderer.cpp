@@ -88,9 +88,10 @@ QImage SoftRenderer::render(const Model &model, double headingDegrees) const
                          QVector3D::dotProduct(world, toViewer)};
     };
 
-    // The shadow on the ground, cast along the light.
+    // The shadow on the ground, cast along the light by the body: small high
+    // parts would throw loose specks beside it.
     for (const ModelTriangle &t : model) {
-        if (t.alpha < 0.5f)
+        if (t.alpha < 0.5f || std::max({t.p[0].z(), t.p[1].z(), t.p[2].z()}) > 1.0f)
             continue;
         Projected v[3];
         for (int i = 0; i < 3; ++i) {
