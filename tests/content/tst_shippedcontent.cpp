@@ -58,7 +58,7 @@ private slots:
         int flat = 0, animated = 0, perspective = 0;
         for (const AvatarItem &a : m_catalogue.avatars()) {
             perspective += a.perspective;
-            animated += a.animated;
+            animated += a.animated && QImageReader(a.sourceFile).imageCount() > 1 ? 1 : 0;
             flat += (!a.perspective && !a.animated && a.name != QLatin1String("01_no_avatar")) ? 1 : 0;
         }
         int templates = 0;
