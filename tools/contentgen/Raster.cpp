@@ -56,6 +56,14 @@ void boxPass(std::vector<float> &values, int width, int height, int radius, bool
 
 } // namespace
 
+void blurChannel(std::vector<float> &values, int width, int height, int radius, int passes)
+{
+    for (int p = 0; p < passes && radius > 0; ++p) {
+        boxPass(values, width, height, radius, true);
+        boxPass(values, width, height, radius, false);
+    }
+}
+
 void boxBlur(QImage &image, int radius, int passes)
 {
     if (radius <= 0)
@@ -71,10 +79,7 @@ void boxBlur(QImage &image, int radius, int passes)
             for (int x = 0; x < w; ++x)
                 values[size_t(y) * size_t(w) + size_t(x)] = float((row[x] >> (channel * 8)) & 0xFF);
         }
-        for (int p = 0; p < passes; ++p) {
-            boxPass(values, w, h, radius, true);
-            boxPass(values, w, h, radius, false);
-        }
+        blurChannel(values, w, h, radius, passes);
         for (int y = 0; y < h; ++y) {
             auto *row = reinterpret_cast<QRgb *>(image.scanLine(y));
             for (int x = 0; x < w; ++x) {

@@ -6,6 +6,8 @@
 #include <QSize>
 #include <QString>
 
+#include <vector>
+
 // Picture helpers shared by every kind of content.
 namespace raster {
 
@@ -13,8 +15,11 @@ namespace raster {
 // drawing's aspect ratio and centring it. A null picture when the SVG is invalid.
 QImage renderSvg(const QByteArray &svg, const QSize &size);
 
-// Blurs the alpha channel by repeated box passes (close to a Gaussian).
+// Blurs every channel by repeated box passes (close to a Gaussian).
 void boxBlur(QImage &image, int radius, int passes = 3);
+
+// The same for one channel of w x h values.
+void blurChannel(std::vector<float> &values, int width, int height, int radius, int passes);
 
 // Puts a soft shadow of the picture's own shape below it; offset and blur in pixels.
 QImage withDropShadow(const QImage &picture, QPointF offset, int blur, double opacity);

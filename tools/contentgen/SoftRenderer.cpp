@@ -47,13 +47,19 @@ void rasterise(const Projected (&v)[3], int w, int h, Fill fill)
     const int x1 = std::min(w - 1, int(std::ceil(std::max({v[0].x, v[1].x, v[2].x}))));
     const int y0 = std::max(0, int(std::floor(std::min({v[0].y, v[1].y, v[2].y}))));
     const int y1 = std::min(h - 1, int(std::ceil(std::max({v[0].y, v[1].y, v[2].y}))));
+    const float inverse = 1.0f / area;
     for (int y = y0; y <= y1; ++y) {
         for (int x = x0; x <= x1; ++x) {
             const float px = x + 0.5f, py = y + 0.5f;
-            const float w0 = edge(v[1], v[2], px, py) / area;
-            const float w1 = edge(v[2], v[0], px, py) / area;
-            const float w2 = edge(v[0], v[1], px, py) / area;
-            if (w0 < 0 || w1 < 0 || w2 < 0)
+            // Inside when all three have the sign of the area.
+            const float w0 = edge(v[1], v[2], px, py) * inverse;
+            if (w0 < 0)
+                continue;
+            const float w1 = edge(v[2], v[0], px, py) * inverse;
+            if (w1 < 0)
+                continue;
+            const float w2 = 1.0f - w0 - w1;
+            if (w2 < 0)
                 continue;
             fill(size_t(y) * size_t(w) + size_t(x), w0, w1, w2);
         }
@@ -102,11 +108,12 @@ QImage SoftRenderer::render(const Model &model, double headingDegrees) const
         rasterise(v, big, big, [&](size_t at, float, float, float) { buffers.shadow[at] = 1.0f; });
     }
 
-    auto shade = [&](const ModelTriangle &t, float w0, float w1, float w2, const QVector3D &faceNormal) {
-        const QVector3D base(float(t.colour.redF()), float(t.colour.greenF()), float(t.colour.blueF()));
+    auto shade = [&](const ModelTriangle &t, const QVector3D (&normals)[3], const QVector3D &base, float w0, float w1,
+                     float w2, const QVector3D &faceNormal) {
         if (t.emissive)
             return base;
-        QVector3D n = (toWorld(t.n[0]) * w0 + toWorld(t.n[1]) * w1 + toWorld(t.n[2]) * w2).normalized();
+        QVector3D n = normals[0] * w0 + normals[1] * w1 + normals[2] * w2;
+        n /= std::sqrt(QVector3D::dotProduct(n, n));
         if (QVector3D::dotProduct(faceNormal, toViewer) < 0)
             n = -n;
         if (QVector3D::dotProduct(n, toViewer) < 0)
@@ -133,11 +140,13 @@ QImage SoftRenderer::render(const Model &model, double headingDegrees) const
                 v[i] = project(world[i]);
             }
             const QVector3D faceNormal = QVector3D::crossProduct(world[1] - world[0], world[2] - world[0]).normalized();
+            const QVector3D normals[3] = {toWorld(t.n[0]), toWorld(t.n[1]), toWorld(t.n[2])};
+            const QVector3D base(float(t.colour.redF()), float(t.colour.greenF()), float(t.colour.blueF()));
             rasterise(v, big, big, [&](size_t at, float w0, float w1, float w2) {
                 const float depth = w0 * v[0].depth + w1 * v[1].depth + w2 * v[2].depth;
                 if (depth <= buffers.depth[at])
                     return;
-                const QVector3D c = shade(t, w0, w1, w2, faceNormal);
+                const QVector3D c = shade(t, normals, base, w0, w1, w2, faceNormal);
                 if (glass) {
                     buffers.colour[at] = buffers.covered[at] ? buffers.colour[at] * (1 - t.alpha) + c * t.alpha : c;
                     if (!buffers.covered[at])
@@ -153,12 +162,11 @@ QImage SoftRenderer::render(const Model &model, double headingDegrees) const
     }
 
     // Down-sample: coverage becomes alpha; the blurred shadow lies under the car.
-    QImage shadow(m_size, m_size, QImage::Format_ARGB32_Premultiplied);
+    std::vector<float> shadowAlpha(size_t(m_size) * size_t(m_size));
     QImage image(m_size, m_size, QImage::Format_ARGB32_Premultiplied);
     const int ss = m_supersample;
     for (int y = 0; y < m_size; ++y) {
         auto *row = reinterpret_cast<QRgb *>(image.scanLine(y));
-        auto *shadowRow = reinterpret_cast<QRgb *>(shadow.scanLine(y));
         for (int x = 0; x < m_size; ++x) {
             QVector3D sum;
             float hits = 0, shade = 0;
@@ -179,10 +187,16 @@ QImage SoftRenderer::render(const Model &model, double headingDegrees) const
             auto channel = [](float v) { return int(std::clamp(v, 0.0f, 1.0f) * 255.0f + 0.5f); };
             row[x] = qRgba(channel(std::min(c.x(), alpha)), channel(std::min(c.y(), alpha)),
                            channel(std::min(c.z(), alpha)), channel(alpha));
-            shadowRow[x] = qRgba(0, 0, 0, channel(0.38f * shade / n));
+            shadowAlpha[size_t(y) * size_t(m_size) + size_t(x)] = 0.38f * shade / n;
         }
     }
-    raster::boxBlur(shadow, std::max(1, m_size / 90));
+    raster::blurChannel(shadowAlpha, m_size, m_size, std::max(1, m_size / 90), 3);
+    QImage shadow(m_size, m_size, QImage::Format_ARGB32_Premultiplied);
+    for (int y = 0; y < m_size; ++y) {
+        auto *row = reinterpret_cast<QRgb *>(shadow.scanLine(y));
+        for (int x = 0; x < m_size; ++x)
+            row[x] = qRgba(0, 0, 0, int(std::clamp(shadowAlpha[size_t(y) * size_t(m_size) + size_t(x)], 0.0f, 1.0f) * 255.0f + 0.5f));
+    }
     QPainter painter(&shadow);
     painter.drawImage(0, 0, image);
     painter.end();

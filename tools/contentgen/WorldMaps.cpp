@@ -33,11 +33,25 @@ double smoothstep(double edge0, double edge1, double x)
     return t * t * (3 - 2 * t);
 }
 
-QColor mix(const QColor &a, const QColor &b, double t)
+// A colour for the per-pixel work, where QColor costs too much.
+struct Rgb
 {
-    t = std::clamp(t, 0.0, 1.0);
-    return QColor::fromRgbF(a.redF() + (b.redF() - a.redF()) * t, a.greenF() + (b.greenF() - a.greenF()) * t,
-                            a.blueF() + (b.blueF() - a.blueF()) * t);
+    float r, g, b;
+    constexpr Rgb(int red, int green, int blue) : r(float(red)), g(float(green)), b(float(blue)) {}
+    constexpr Rgb(float red, float green, float blue, bool) : r(red), g(green), b(blue) {}
+    explicit Rgb(QRgb c) : r(float(qRed(c))), g(float(qGreen(c))), b(float(qBlue(c))) {}
+    Rgb scaled(double f) const { return {float(r * f), float(g * f), float(b * f), true}; }
+    QRgb rgb() const
+    {
+        auto channel = [](float v) { return int(std::clamp(v + 0.5f, 0.0f, 255.0f)); };
+        return qRgb(channel(r), channel(g), channel(b));
+    }
+};
+
+Rgb mix(const Rgb &a, const Rgb &b, double t)
+{
+    const float f = float(std::clamp(t, 0.0, 1.0));
+    return {a.r + (b.r - a.r) * f, a.g + (b.g - a.g) * f, a.b + (b.b - a.b) * f, true};
 }
 
 // Smooth value noise in 0..1, several octaves.
@@ -76,6 +90,33 @@ private:
     }
 
     quint32 m_seed;
+};
+
+// Noise of one scale over a whole picture, worked out every few pixels and
+// interpolated between: the slow fields cost a fraction of the exact ones.
+class NoiseField
+{
+public:
+    NoiseField(const Noise &noise, int width, int height, double scale, int octaves)
+        : m_columns(width / step + 2), m_rows(height / step + 2), m_values(size_t(m_columns) * size_t(m_rows))
+    {
+        for (int r = 0; r < m_rows; ++r)
+            for (int c = 0; c < m_columns; ++c)
+                m_values[size_t(r) * size_t(m_columns) + size_t(c)] = float(noise.at(c * step / scale, r * step / scale, octaves));
+    }
+
+    double at(int x, int y) const
+    {
+        const int c = x / step, r = y / step;
+        const double fx = double(x % step) / step, fy = double(y % step) / step;
+        auto v = [&](int cc, int rr) { return double(m_values[size_t(rr) * size_t(m_columns) + size_t(cc)]); };
+        return (v(c, r) * (1 - fx) + v(c + 1, r) * fx) * (1 - fy) + (v(c, r + 1) * (1 - fx) + v(c + 1, r + 1) * fx) * fy;
+    }
+
+private:
+    static constexpr int step = 4;
+    int m_columns, m_rows;
+    std::vector<float> m_values;
 };
 
 // Squared Euclidean distance along one line: the lower envelope of parabolas
@@ -328,10 +369,10 @@ QImage WorldMaps::physical(int width) const
 {
     const Grid &g = grid(width);
     const double px = width / 4096.0; // lengths below are given for a 4096 pixel map
-    const Noise noise(7);
-    const Noise warpNoise(5);
-    const QColor deep(28, 74, 122), shallow(104, 170, 212), coastWater(150, 200, 226);
-    const QColor forest(86, 140, 82), green(146, 180, 112), dry(214, 196, 146), tundra(170, 176, 150),
+    const NoiseField noise(Noise(7), g.w, g.h, 90.0 * px, 4);
+    const NoiseField warpNoise(Noise(5), g.w, g.h, 260.0 * px, 5);
+    const Rgb deep(28, 74, 122), shallow(104, 170, 212), coastWater(150, 200, 226);
+    const Rgb forest(86, 140, 82), green(146, 180, 112), dry(214, 196, 146), tundra(170, 176, 150),
         iceColour(242, 246, 249);
     QImage image(g.w, g.h, QImage::Format_RGB32);
     for (int y = 0; y < g.h; ++y) {
@@ -339,23 +380,23 @@ QImage WorldMaps::physical(int width) const
         auto *row = reinterpret_cast<QRgb *>(image.scanLine(y));
         for (int x = 0; x < g.w; ++x) {
             const size_t i = g.at(x, y);
-            const double n = noise.at(x / (90.0 * px), y / (90.0 * px), 4);
-            QColor c;
+            const double n = noise.at(x, y);
+            Rgb c(0, 0, 0);
             if (!g.land[i]) {
                 const double near = std::exp(-g.toLand[i] / (28.0 * px));
                 c = mix(deep, shallow, near * 0.55 + 0.12 * n);
                 c = mix(c, coastWater, std::exp(-g.toLand[i] / (4.0 * px)) * 0.6);
-                c = mix(c, deep.darker(130), smoothstep(55, 85, lat) * 0.3);
+                c = mix(c, deep.scaled(1 / 1.3), smoothstep(55, 85, lat) * 0.3);
             } else if (g.ice[i] || lat > 80) {
-                c = mix(iceColour, QColor(214, 226, 236), n * 0.6);
+                c = mix(iceColour, Rgb(214, 226, 236), n * 0.6);
             } else {
-                const double warp = warpNoise.at(x / (260.0 * px), y / (260.0 * px), 5);
+                const double warp = warpNoise.at(x, y);
                 const double dryness = climateAt((x + 0.5) * 360.0 / g.w - 180.0, latitudeOfRow(y, g.h), g.toSea[i] / px, warp).dry;
                 c = mix(green, forest, (1 - smoothstep(0, 14, lat)) * 0.9 + smoothstep(48, 58, lat) * 0.5);
                 c = mix(c, dry, dryness);
                 c = mix(c, tundra, smoothstep(60, 70, lat));
                 c = mix(c, iceColour, smoothstep(72, 80, lat));
-                c = c.lighter(100 + int(14 * (n - 0.5)));
+                c = c.scaled(1 + 0.14 * (n - 0.5));
             }
             row[x] = c.rgb();
         }
@@ -379,20 +420,21 @@ QImage WorldMaps::oldPaper(int width) const
 {
     const Grid &g = grid(width);
     const double px = width / 4096.0;
-    const Noise noise(11);
-    const QColor paper(236, 220, 184), paperDark(196, 166, 118), sea(222, 214, 186), land(222, 196, 140),
+    const NoiseField noise(Noise(11), g.w, g.h, 160.0 * px, 5);
+    const Noise grain(11);
+    const Rgb paper(236, 220, 184), paperDark(196, 166, 118), sea(222, 214, 186), land(222, 196, 140),
         ink(92, 60, 30);
     QImage image(g.w, g.h, QImage::Format_RGB32);
     for (int y = 0; y < g.h; ++y) {
         auto *row = reinterpret_cast<QRgb *>(image.scanLine(y));
         for (int x = 0; x < g.w; ++x) {
             const size_t i = g.at(x, y);
-            const double n = noise.at(x / (160.0 * px), y / (160.0 * px), 5);
-            const double fine = noise.at(x / (6.0 * px), y / (6.0 * px), 2);
+            const double n = noise.at(x, y);
+            const double fine = grain.at(x / (6.0 * px), y / (6.0 * px), 2);
             // Darker towards the edges of the sheet.
             const double ex = std::min(x, g.w - 1 - x) / (0.12 * g.w), ey = std::min(y, g.h - 1 - y) / (0.12 * g.h);
             const double vignette = 1 - smoothstep(0, 1, std::min({ex, ey, 1.0}));
-            QColor c;
+            Rgb c(0, 0, 0);
             if (!g.land[i]) {
                 c = mix(sea, paper, 0.3 + 0.4 * n);
                 // Ripples drawn along the coast, fading out to sea.
@@ -404,7 +446,7 @@ QImage WorldMaps::oldPaper(int width) const
                 }
             } else {
                 c = mix(land, paper, 0.35 * n);
-                c = mix(c, QColor(196, 160, 100), std::exp(-g.toSea[i] / (5.0 * px)) * 0.6);
+                c = mix(c, Rgb(196, 160, 100), std::exp(-g.toSea[i] / (5.0 * px)) * 0.6);
             }
             // An inked coastline on the edge between the two distance fields.
             const double edge = (g.land[i] ? g.toSea[i] : g.toLand[i]) - 0.5;
@@ -430,7 +472,7 @@ QImage WorldMaps::oldPaper(int width) const
     for (const GeoFeature &f : m_countries)
         p.drawPath(f.outline);
     p.resetTransform();
-    drawCompassRose(p, QPointF((-148.0 + 180) * g.w / 360.0, (90 + 42.0) * g.h / 180.0), 150 * px, ink);
+    drawCompassRose(p, QPointF((-148.0 + 180) * g.w / 360.0, (90 + 42.0) * g.h / 180.0), 150 * px, QColor(ink.rgb()));
     p.end();
     return image;
 }
@@ -439,16 +481,16 @@ QImage WorldMaps::night(int width) const
 {
     const Grid &g = grid(width);
     const double px = width / 4096.0;
-    const Noise noise(23);
-    const Noise warpNoise(5); // the physical map's, so that its dry land stays dark
-    const QColor deep(3, 6, 16), nearCoast(10, 20, 40), landDark(14, 18, 28), landEdge(24, 32, 50);
+    const NoiseField noise(Noise(23), g.w, g.h, 80.0 * px, 4);
+    const NoiseField warpNoise(Noise(5), g.w, g.h, 260.0 * px, 5); // the physical map's, so that its dry land stays dark
+    const Rgb deep(3, 6, 16), nearCoast(10, 20, 40), landDark(14, 18, 28), landEdge(24, 32, 50);
     QImage image(g.w, g.h, QImage::Format_RGB32);
     for (int y = 0; y < g.h; ++y) {
         auto *row = reinterpret_cast<QRgb *>(image.scanLine(y));
         for (int x = 0; x < g.w; ++x) {
             const size_t i = g.at(x, y);
-            const double n = noise.at(x / (80.0 * px), y / (80.0 * px), 4);
-            QColor c;
+            const double n = noise.at(x, y);
+            Rgb c(0, 0, 0);
             if (!g.land[i])
                 c = mix(deep, nearCoast, std::exp(-g.toLand[i] / (25.0 * px)) * 0.9 + 0.08 * n);
             else
@@ -481,7 +523,7 @@ QImage WorldMaps::night(int width) const
             const QPointF p = toPixels.map(at);
             const int xi = std::clamp(int(p.x()), 0, g.w - 1), yi = std::clamp(int(p.y()), 0, g.h - 1);
             const double toSea = g.toSea[g.at(xi, yi)] / px;
-            const Climate climate = climateAt(at.x(), at.y(), toSea, warpNoise.at(xi / (260.0 * px), yi / (260.0 * px), 5));
+            const Climate climate = climateAt(at.x(), at.y(), toSea, warpNoise.at(xi, yi));
             const double coast = std::exp(-toSea / 140.0);
             const double cold = 1 - smoothstep(52, 66, std::fabs(at.y()));
             const double settled = (0.2 + 0.8 * coast) * cold * (1 - 0.92 * climate.dry) * (1 - 0.85 * climate.jungle);
@@ -500,29 +542,20 @@ QImage WorldMaps::night(int width) const
             addLight(p.x() + r * std::cos(a), p.y() + r * std::sin(a), float(0.6 + random.generateDouble()));
         }
     }
-    QImage halo(g.w, g.h, QImage::Format_ARGB32_Premultiplied);
-    QImage core(g.w, g.h, QImage::Format_ARGB32_Premultiplied);
-    for (int y = 0; y < g.h; ++y) {
-        auto *h = reinterpret_cast<QRgb *>(halo.scanLine(y));
-        auto *c = reinterpret_cast<QRgb *>(core.scanLine(y));
-        for (int x = 0; x < g.w; ++x) {
-            const int v = int(std::min(255.0f, glow[g.at(x, y)] * 255.0f));
-            h[x] = qRgba(v, v, v, v);
-            c[x] = qRgba(v, v, v, v);
-        }
-    }
-    raster::boxBlur(halo, std::max(1, int(4 * px)));
-    raster::boxBlur(core, std::max(1, int(1 * px)), 1);
+    // A wide warm halo and a small bright core around every light.
+    for (float &v : glow)
+        v = std::min(v, 1.0f);
+    std::vector<float> halo = glow;
+    raster::blurChannel(halo, g.w, g.h, std::max(1, int(4 * px)), 3);
+    raster::blurChannel(glow, g.w, g.h, std::max(1, int(1 * px)), 1);
     for (int y = 0; y < g.h; ++y) {
         auto *row = reinterpret_cast<QRgb *>(image.scanLine(y));
-        const auto *h = reinterpret_cast<const QRgb *>(halo.constScanLine(y));
-        const auto *c = reinterpret_cast<const QRgb *>(core.constScanLine(y));
         for (int x = 0; x < g.w; ++x) {
-            const double haloV = std::min(1.0, qAlpha(h[x]) / 255.0 * 6.0);
-            const double coreV = std::min(1.0, qAlpha(c[x]) / 255.0 * 2.5);
-            QColor base = QColor::fromRgb(row[x]);
-            base = mix(base, QColor(255, 170, 70), haloV * 0.55);
-            base = mix(base, QColor(255, 228, 160), coreV);
+            const double haloV = std::min(1.0, halo[g.at(x, y)] * 6.0);
+            const double coreV = std::min(1.0, glow[g.at(x, y)] * 2.5);
+            Rgb base(row[x]);
+            base = mix(base, Rgb(255, 170, 70), haloV * 0.55);
+            base = mix(base, Rgb(255, 228, 160), coreV);
             row[x] = base.rgb();
         }
     }
