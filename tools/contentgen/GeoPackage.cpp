@@ -116,8 +116,7 @@ private:
     bool m_little = true;
 };
 
-} // namespace
-
+// The path of one standard GeoPackage geometry blob.
 bool parseGeoPackageGeometry(const QByteArray &blob, QPainterPath &path)
 {
     // "GP", version, flags, srs id, then an envelope whose size the flags give.
@@ -132,6 +131,8 @@ bool parseGeoPackageGeometry(const QByteArray &blob, QPainterPath &path)
     WkbReader reader(blob, 8 + envelopeBytes[envelope]);
     return reader.geometry(path);
 }
+
+} // namespace
 
 bool readGeoPackageLayer(const QString &file, const QString &layer, const QString &labelColumn,
                          std::vector<GeoFeature> &features)

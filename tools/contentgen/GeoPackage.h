@@ -17,6 +17,3 @@ struct GeoFeature
 // False with a trace line when the file, the layer or a geometry can't be read.
 bool readGeoPackageLayer(const QString &file, const QString &layer, const QString &labelColumn,
                          std::vector<GeoFeature> &features);
-
-// The path of one standard GeoPackage geometry blob; exposed for its own checks.
-bool parseGeoPackageGeometry(const QByteArray &blob, QPainterPath &path);
