@@ -88,13 +88,15 @@ QImage symbolPicture(const QByteArray &svg, int size, double shadowScale)
     return raster::withDropShadow(picture, QPointF(3, 5) * shadowScale, int(9 * shadowScale), 0.38);
 }
 
-QImage avatarPicture(const QByteArray &svg, int size)
+// A picture that turns with the road gets its shadow straight below, so that
+// the shadow doesn't swing round with the heading.
+QImage avatarPicture(const QByteArray &svg, int size, bool turns)
 {
     const QImage picture = raster::renderSvg(svg, QSize(size, size));
     if (picture.isNull())
         return picture;
     const double s = size / double(avatarSize);
-    return raster::withDropShadow(picture, QPointF(6, 10) * s, int(16 * s), 0.32);
+    return raster::withDropShadow(picture, turns ? QPointF(0, 0) : QPointF(6, 10) * s, int(16 * s), 0.32);
 }
 
 // The body with a turning part drawn over it, slightly smeared to look fast.
@@ -162,18 +164,18 @@ bool animatedAvatar(const Drawings &drawings, const QString &stem, const QString
                        spinFrames(body, spinner, at, frames, cycle, avatarThumbSize), delay);
 }
 
-bool flatAvatar(const Drawings &drawings, const QString &stem, const QString &out)
+bool flatAvatar(const Drawings &drawings, const QString &stem, const QString &out, bool turns)
 {
     QImage picture;
     if (drawings.value(stem, QStringLiteral("svg")) == QLatin1String("none")) {
         picture = QImage(avatarSize, avatarSize, QImage::Format_ARGB32_Premultiplied);
         picture.fill(Qt::transparent);
     } else {
-        picture = avatarPicture(drawings.svg(stem), avatarSize);
+        picture = avatarPicture(drawings.svg(stem), avatarSize, turns);
     }
     const bool ownThumb = drawings.has(stem, QStringLiteral("thumb"));
     const QImage thumb = avatarPicture(drawings.svg(stem, ownThumb ? QStringLiteral("thumb") : QStringLiteral("svg")),
-                                       avatarThumbSize);
+                                       avatarThumbSize, turns);
     if (picture.isNull() || thumb.isNull())
         return fail(QStringLiteral("no drawing for avatar %s"), stem);
     return raster::save(picture, out + QLatin1Char('/') + stem + QStringLiteral(".png"))
@@ -213,7 +215,7 @@ bool avatars(const QString &source, const QString &out)
         else if (mainValue(ini, QStringLiteral("type")) == QLatin1String("gif"))
             ok = animatedAvatar(drawings, stem, out);
         else
-            ok = flatAvatar(drawings, stem, out);
+            ok = flatAvatar(drawings, stem, out, mainValue(ini, QStringLiteral("allowRotation")) == QLatin1String("true"));
         if (!ok)
             return false;
     }
