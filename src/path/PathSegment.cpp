@@ -1,5 +1,6 @@
 #include "path/PathSegment.h"
 
+#include "path/ContentPath.h"
 #include "project/ProjectController.h"
 #include "project/ValueParsers.h"
 
@@ -55,8 +56,11 @@ void PilotProperties::Load(ProjectController &store, const QString &section)
         setFlag(rotation, on);
     if (initBool(store.readProperty(section, key("pilot_symmetric"), QString()), on))
         setFlag(symmetric, on);
-    initString(store.readProperty(section, key("pilot_source"), QString()), source);
-    initString(store.readProperty(section, key("pilot_thumb"), QString()), thumb);
+    // Avatars of the catalogue live in the installation the project was saved with.
+    if (initString(store.readProperty(section, key("pilot_source"), QString()), source))
+        source = rebaseContentPath(source);
+    if (initString(store.readProperty(section, key("pilot_thumb"), QString()), thumb))
+        thumb = rebaseContentPath(thumb);
     initString(store.readProperty(section, key("pilot_displayFormat"), QString()), displayFormat);
     initDouble(store.readProperty(section, key("pilot_width"), QString()), width);
 }

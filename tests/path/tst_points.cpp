@@ -7,6 +7,7 @@
 #include "project/QProjectController.h"
 #include "project/ValueParsers.h"
 
+#include <QDir>
 #include <QFile>
 #include <QImage>
 #include <QMap>
@@ -459,6 +460,12 @@ private slots:
         QCOMPARE(rebaseContentPath(QStringLiteral("file:///home/u/photos/a.png")),
                  QStringLiteral("file:///home/u/photos/a.png"));
         QCOMPARE(rebaseContentPath(QStringLiteral("/home/u/photos/a.png")), QStringLiteral("/home/u/photos/a.png"));
+        // A file that opens where it was stored is left there.
+        QVERIFY(QDir().mkpath(path(QStringLiteral("imgsrc"))));
+        const QString own = path(QStringLiteral("imgsrc/own.png"));
+        writeJpeg(own, -1);
+        QCOMPARE(rebaseContentPath(own), own);
+        QCOMPARE(rebaseContentPath(QStringLiteral("file://") + own), QStringLiteral("file://") + own);
 
         // Through a key point load: both sources, a present value only.
         MemoryStore store;

@@ -2,6 +2,7 @@
 #include "project/DocumentFile.h"
 #include "project/PainterPathRenderer_Controller.h"
 #include "project/ValueParsers.h"
+#include "app/ProgramFolder.h"
 
 #include <QDir>
 #include <QFile>
@@ -445,6 +446,36 @@ private slots:
         QCOMPARE(doc.timing().flyInTilt, 54.0);
         QCOMPARE(doc.timing().durationFactor, -1.0);
         QCOMPARE(q.mediaPoints.size(), size_t(2));
+    }
+
+    void avatarsMoveToThisInstallation_data()
+    {
+        QTest::addColumn<QString>("sections");
+        const QString keyPoints = QStringLiteral(
+            "[keypoints]\nelements=2\n[keypoint0]\nx=1\ny=2\n[keypoint1]\nx=3\ny=4\n");
+        const QString avatar = QStringLiteral("pilot_source=C:/Program Files/Old/imgsrc/pilots/car.png\n"
+                                              "pilot_thumb=file:///D:/Old/imgsrc/pilots/car_t.png\n");
+        QTest::newRow("segments") << keyPoints + QStringLiteral("[pathSegments]\nelements=2\n[pathsegment0]\n") + avatar +
+                                         QStringLiteral("[pathsegment1]\n") + avatar;
+        QTest::newRow("one avatar of version 1") << keyPoints + QStringLiteral("[pilot]\n") + avatar;
+    }
+
+    void avatarsMoveToThisInstallation()
+    {
+        QFETCH(QString, sections);
+        const QString file = path(QStringLiteral("moved.zkgeo"));
+        writeText(file, (projectHeader() + QStringLiteral("[animator]\ncurvemode=1\npathtype=1\n") + sections).toUtf8());
+        setProgramFolder(QStringLiteral("/opt/tourlet"));
+        PainterPathRenderer_Controller doc;
+        const DocumentOpenResult result = openDocumentFile(doc, file);
+        setProgramFolder(QString());
+        QCOMPARE(int(result.status), int(DocumentOpenResult::Status::Project));
+        const Path &p = doc.pathManager().activeChecked();
+        QCOMPARE(p.pathSegments.size(), size_t(2));
+        for (const PathSegment &s : p.pathSegments) {
+            QCOMPARE(s.pilot.source, QStringLiteral("/opt/tourlet/imgsrc/pilots/car.png"));
+            QCOMPARE(s.pilot.thumb, QStringLiteral("file:///opt/tourlet/imgsrc/pilots/car_t.png"));
+        }
     }
 
     void themeInTheSameWritingGivesTheSameBytes()
