@@ -1,14 +1,12 @@
 #include "path/BasePoint.h"
 
+#include "path/IdCounter.h"
 #include "path/PointRecord.h"
-
-namespace {
-uint32_t g_nextPointId = 1;
-}
 
 uint32_t drawPointId()
 {
-    return g_nextPointId++;
+    static IdCounter counter;
+    return counter.draw();
 }
 
 BasePoint::BasePoint() : id(drawPointId()) {}

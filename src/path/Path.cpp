@@ -3,6 +3,7 @@
 #include "app/Trace.h"
 #include "path/CurveGenerator.h"
 #include "path/GeoDistance.h"
+#include "path/IdCounter.h"
 #include "project/ProjectController.h"
 #include "project/ValueParsers.h"
 
@@ -16,8 +17,8 @@ namespace {
 
 uint32_t nextPathIdentifier()
 {
-    static uint32_t counter = 1;
-    return counter++;
+    static IdCounter counter;
+    return counter.draw();
 }
 
 template <typename Points>

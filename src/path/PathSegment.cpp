@@ -1,6 +1,7 @@
 #include "path/PathSegment.h"
 
 #include "path/ContentPath.h"
+#include "path/IdCounter.h"
 #include "project/ProjectController.h"
 #include "project/ValueParsers.h"
 
@@ -9,8 +10,8 @@ namespace {
 
 uint32_t nextSegmentId()
 {
-    static uint32_t counter = 1;
-    return counter++;
+    static IdCounter counter;
+    return counter.draw();
 }
 
 PilotProperties &defaultPilotRecord()

@@ -2,6 +2,7 @@
 #include "path/ContentPath.h"
 #include "path/CurvePoint.h"
 #include "path/DefaultTitle.h"
+#include "path/IdCounter.h"
 #include "path/KeyPoints.h"
 #include "path/MediaPoint.h"
 #include "project/QProjectController.h"
@@ -145,6 +146,12 @@ private slots:
         QCOMPARE(list.at(1).id, a.id);
         QCOMPARE(list.at(2).id, d.id);
         QVERIFY(list.at(0).id > d.id);
+
+        // A counter that runs over starts at 1 again: 0 means no point.
+        IdCounter nearTheEnd(0xFFFFFFFEu);
+        QCOMPARE(nearTheEnd.draw(), 0xFFFFFFFEu);
+        QCOMPARE(nearTheEnd.draw(), 0xFFFFFFFFu);
+        QCOMPARE(nearTheEnd.draw(), 1u);
     }
 
     void constructorsAndSetters()
