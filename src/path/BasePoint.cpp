@@ -49,9 +49,9 @@ bool BasePoint::Save(ProjectController &store, QString section) const
 bool BasePoint::Load(ProjectController &store, QString section)
 {
     const PointRecordReader in(store, section);
-    in.read(QStringLiteral("x"), x);
-    in.read(QStringLiteral("y"), y);
-    in.read(QStringLiteral("z"), z);
+    in.readCoordinate(QStringLiteral("x"), x);
+    in.readCoordinate(QStringLiteral("y"), y);
+    in.readCoordinate(QStringLiteral("z"), z);
     in.read(QStringLiteral("tt"), tt);
     return true;
 }

@@ -18,6 +18,8 @@ public:
     bool has(const QString &key) const { return !text(key).isEmpty(); }
 
     bool read(const QString &key, double &out) const;
+    // A coordinate must be a finite number: "nan" or "inf" is damage, as in a track file.
+    bool readCoordinate(const QString &key, double &out) const;
     bool read(const QString &key, int32_t &out) const;
     bool read(const QString &key, uint32_t &out) const;
     bool read(const QString &key, bool &out) const;

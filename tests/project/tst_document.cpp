@@ -554,6 +554,14 @@ private slots:
         QVERIFY(doc.pathManager().activeChecked().keyPoints.empty());
         QVERIFY(doc.projectController().isIdle());
 
+        // A coordinate that is no finite number is damage too, wherever a point stands.
+        for (const char *point : {"[keypoints]\nelements=1\n[keypoint0]\nx=nan\n",
+                                  "[keypoints]\nelements=1\n[keypoint0]\nx=1\nlatitude=-inf\n",
+                                  "[centerPosition]\naltitude=infinity\n"}) {
+            writeText(damaged, projectHeader().toUtf8() + point);
+            QCOMPARE(int(openDocumentFile(doc, damaged).status), int(DocumentOpenResult::Status::DamagedProject));
+        }
+
         writeText(damaged, (projectHeader() + QStringLiteral("[animator]\nprojectWidth=99999999999\n")).toUtf8());
         QCOMPARE(int(openDocumentFile(doc, damaged).status), int(DocumentOpenResult::Status::DamagedProject));
         QCOMPARE(doc.fields().projectWidth, 1920);
