@@ -662,14 +662,14 @@ bool Path::LoadCurvePoints(ProjectController &store, const QString &section)
 {
     int32_t count = 0;
     initInt(store.readProperty(section, QStringLiteral("elements"), QString()), count);
-    for (int i = 0; i < count; ++i) {
-        const QString pointSection = QStringLiteral("curvepoint%1").arg(i);
-        // A damaged count must not make up samples: the list ends at its first missing record.
-        if (store.readProperty(pointSection, QStringLiteral("x"), QString()).isEmpty())
-            break;
+    const std::vector<int32_t> present = store.numberedSections(QStringLiteral("curvepoint"), count);
+    if (present.size() != size_t(std::max(count, 0)))
+        logTrace(3, QStringLiteral("Path::LoadCurvePoints -> %d of %d sections present"), int(present.size()), count);
+    curvePoints.reserve(curvePoints.size() + present.size());
+    for (const int32_t i : present) {
         CurvePoint p;
-        p.Load(store, pointSection);
-        curvePoints.push_back(p);
+        p.Load(store, QStringLiteral("curvepoint%1").arg(i));
+        curvePoints.push_back(std::move(p));
     }
     return true;
 }

@@ -272,6 +272,14 @@ IniFileReader::Lookup IniFileReader::value(const QString &section, const QString
     return Lookup::Found;
 }
 
+void IniFileReader::listSections(NumberedSections &out) const
+{
+    for (const Section &s : m_sections) {
+        if (s.end > s.begin)
+            out.add(m_data + s.name, int(s.nameLength));
+    }
+}
+
 bool IniFileReader::unescapeValue(const char *str, qint64 from, qint64 to, QString &text, QStringList &list)
 {
     static const char escapeCodes[][2] = {{'a', '\a'}, {'b', '\b'}, {'f', '\f'}, {'n', '\n'}, {'r', '\r'}, {'t', '\t'},

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/LargeBuffer.h"
+#include "project/NumberedSections.h"
 
 #include <QByteArray>
 #include <QString>
@@ -27,6 +28,9 @@ public:
     // The value as text, lists joined with ','. NeedsStore for a value that reads as
     // a typed one (a leading '@'), which only the store itself knows how to convert.
     Lookup value(const QString &section, const QString &key, QString &out) const;
+
+    // Adds every section that holds a key.
+    void listSections(NumberedSections &out) const;
 
     // The value part of a line, unescaped and unquoted; true when it holds a list.
     static bool unescapeValue(const char *data, qint64 from, qint64 to, QString &text, QStringList &list);

@@ -89,6 +89,7 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
         return false;
     }
     m_writeFailed = false;
+    m_numbered.reset();
     if (!forLoad) {
         forgetReadFile();
         m_fileName = fileName;
@@ -200,9 +201,24 @@ bool QProjectController::closeProjectFile()
     }
     m_writer.reset();
     m_reader.reset();
+    m_numbered.reset();
     if (m_plainFile)
         m_lastRead.reader = std::move(m_plainFile);
     return true;
+}
+
+std::vector<int32_t> QProjectController::numberedSections(QString stem, int32_t count)
+{
+    if (!m_numbered) {
+        m_numbered = std::make_unique<NumberedSections>();
+        if (m_plainFile) {
+            m_plainFile->listSections(*m_numbered);
+        } else if (m_reader) {
+            for (const QString &group : m_reader->childGroups())
+                m_numbered->add(group);
+        }
+    }
+    return m_numbered->below(stem, count);
 }
 
 void QProjectController::forgetReadFile()

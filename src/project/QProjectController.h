@@ -24,6 +24,7 @@ public:
     bool writeProperty(QString section, QString key, QString value) override;
     QString readProperty(QString section, QString key, QString defaultValue) override;
     bool closeProjectFile() override;
+    std::vector<int32_t> numberedSections(QString stem, int32_t count) override;
 
     bool isIdle() const { return !isWriting() && !isReading(); }
     bool isWriting() const { return m_writer != nullptr || m_newFile != nullptr; }
@@ -47,6 +48,7 @@ private:
     std::unique_ptr<QSettings> m_reader;
     std::unique_ptr<IniFileWriter> m_newFile;
     std::unique_ptr<IniFileReader> m_plainFile;
+    std::unique_ptr<NumberedSections> m_numbered; // of the file being read, made when first asked
     struct ReadFile
     {
         QString name;

@@ -5,6 +5,7 @@
 #include "path/IdCounter.h"
 #include "path/KeyPoints.h"
 #include "path/MediaPoint.h"
+#include "project/NumberedSections.h"
 #include "project/QProjectController.h"
 #include "project/ValueParsers.h"
 
@@ -44,6 +45,13 @@ public:
     QString readProperty(QString section, QString key, QString defaultValue) override
     {
         return values.value(section + QLatin1Char('/') + key, defaultValue);
+    }
+    std::vector<int32_t> numberedSections(QString stem, int32_t count) override
+    {
+        NumberedSections sections;
+        for (auto it = values.cbegin(); it != values.cend(); ++it)
+            sections.add(it.key().section(QLatin1Char('/'), 0, 0));
+        return sections.below(stem, count);
     }
 
     void set(const QString &section, const QString &key, const QString &value)
@@ -396,7 +404,7 @@ private slots:
         QVERIFY(loadKeyPoints(store, 2, third));
         QCOMPARE(defaultKeyPointTitleCounter(), 4u);
 
-        // A count larger than the sections present stops at the gap.
+        // A count larger than the sections present loads those there are.
         store.set(QStringLiteral("keypoints"), QStringLiteral("elements"), QStringLiteral("1000000"));
         QVector<KeyPoint> damaged;
         QVERIFY(loadKeyPoints(store, 2, damaged));

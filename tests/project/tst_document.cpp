@@ -11,6 +11,7 @@
 #include <QTemporaryDir>
 #include <QTest>
 
+#include <algorithm>
 #include <csignal>
 #include <sys/resource.h>
 
@@ -446,6 +447,82 @@ private slots:
         QCOMPARE(doc.timing().flyInTilt, 54.0);
         QCOMPARE(doc.timing().durationFactor, -1.0);
         QCOMPARE(q.mediaPoints.size(), size_t(2));
+    }
+
+    void listsKeepTheEntriesAfterAGap_data()
+    {
+        QTest::addColumn<QString>("dropped");
+        QTest::addColumn<QString>("list");
+        QTest::addColumn<QStringList>("expected");
+        QTest::newRow("key point") << "keypoint1" << "keyPoints" << QStringList{"k0", "k2"};
+        QTest::newRow("media point") << "mediapoint1" << "mediaPoints" << QStringList{"m0", "m2"};
+        QTest::newRow("photo") << "photopool_item1" << "photos" << QStringList{"/gone/p0.jpg", "/gone/p2.jpg"};
+        QTest::newRow("curve point") << "curvepoint5" << "curve" << QStringList{"1", "2", "3", "4", "5", "7"};
+        QTest::newRow("segment sample") << "pathsegment0curvepoint1" << "segment0" << QStringList{"1", "3", "4"};
+    }
+
+    // A track of samples x = 1..7 with key points on 1, 4 and 7 and photos on 2, 3 and 5.
+    void listsKeepTheEntriesAfterAGap()
+    {
+        QFETCH(QString, dropped);
+        QFETCH(QString, list);
+        QFETCH(QStringList, expected);
+        const uint32_t none = noPointIndex;
+        const int keyAt[] = {0, 3, 6}, mediaAt[] = {1, 2, 4};
+        auto sample = [&](const QString &section, int i) {
+            const int key = int(std::find(std::begin(keyAt), std::end(keyAt), i) - std::begin(keyAt));
+            const int media = int(std::find(std::begin(mediaAt), std::end(mediaAt), i) - std::begin(mediaAt));
+            return QStringLiteral("[%1]\nx=%2\ny=1\ncorrespondingKeyPoint=%3\ncorrespondingMediaPoint=%4\n")
+                .arg(section).arg(i + 1).arg(key < 3 ? uint32_t(key) : none).arg(media < 3 ? uint32_t(media) : none);
+        };
+        QString text = projectHeader() + QStringLiteral("[animator]\ncurvemode=1\npathtype=2\n[curvepoints]\nelements=7\n");
+        for (int i = 0; i < 7; ++i)
+            text += sample(QStringLiteral("curvepoint%1").arg(i), i);
+        text += QStringLiteral("[keypoints]\nelements=3\n[pathSegments]\nelements=3\n"
+                               "[mediapoints]\nelements=3\n[photopool]\nsize=3\n");
+        for (int i = 0; i < 3; ++i) {
+            text += QStringLiteral("[keypoint%1]\nx=%2\ny=1\nkppTitle=k%1\n").arg(i).arg(keyAt[i] + 1);
+            text += QStringLiteral("[mediapoint%1]\nx=%2\ny=1\nlongitude=%2\nlatitude=1\nmppTitle=m%1\n").arg(i).arg(mediaAt[i] + 1);
+            text += QStringLiteral("[photopool_item%1]\npath=/gone/p%1.jpg\n").arg(i);
+            const int first = keyAt[i], last = i < 2 ? keyAt[i + 1] : 6;
+            text += QStringLiteral("[pathsegment%1]\ncurvepoints=%2\n").arg(i).arg(last - first + 1);
+            for (int j = first; j <= last; ++j)
+                text += sample(QStringLiteral("pathsegment%1curvepoint%2").arg(i).arg(j - first), j);
+        }
+        const int at = text.indexOf(QLatin1Char('[') + dropped + QLatin1Char(']'));
+        QVERIFY(at > 0);
+        text.remove(at, text.indexOf(QLatin1Char('['), at + 1) - at);
+        const QString file = path(QStringLiteral("gap.zkgeo"));
+        writeText(file, text.toUtf8());
+
+        PainterPathRenderer_Controller doc;
+        QCOMPARE(int(openDocumentFile(doc, file).status), int(DocumentOpenResult::Status::Project));
+        const Path &p = doc.pathManager().activeChecked();
+        QStringList found;
+        if (list == QLatin1String("keyPoints")) {
+            for (const KeyPoint &k : p.keyPoints)
+                found << k.properties.title;
+        } else if (list == QLatin1String("mediaPoints")) {
+            for (const MediaPoint &m : p.mediaPoints)
+                found << m.properties.title;
+        } else if (list == QLatin1String("photos")) {
+            for (const PoolPhoto &photo : doc.photoPool().photos)
+                found << photo.path;
+        } else {
+            for (const CurvePoint &c : list == QLatin1String("curve") ? p.curvePoints : p.pathSegments.at(0).curvePoints)
+                found << QString::number(c.x);
+        }
+        QCOMPARE(found, expected);
+
+        // The samples still name the points that stand on them.
+        for (const CurvePoint &c : p.curvePoints) {
+            if (const BasePoint *k = p.findPoint(c.correspondingKeyPoint))
+                QCOMPARE(k->x, c.x);
+            if (const BasePoint *m = p.findPoint(c.correspondingMediaPoint))
+                QCOMPARE(m->x, c.x);
+        }
+        QCOMPARE(p.curvePoints.back().correspondingKeyPoint, p.keyPoints.back().id);
+        QCOMPARE(p.curvePoints[4].correspondingMediaPoint, p.mediaPoints.back().id);
     }
 
     void avatarsMoveToThisInstallation_data()
