@@ -1,6 +1,7 @@
 #include "project/QProjectController.h"
 
 #include "app/Trace.h"
+#include "project/SettingsValue.h"
 
 #include <QDateTime>
 #include <QFile>
@@ -152,16 +153,7 @@ QString QProjectController::readProperty(QString section, QString key, QString d
 {
     if (m_plainFile) {
         QString value;
-        switch (m_plainFile->value(section, key, value)) {
-        case IniFileReader::Lookup::Found:
-            return value;
-        case IniFileReader::Lookup::Missing:
-            return defaultValue;
-        case IniFileReader::Lookup::NeedsStore:
-            break;
-        }
-        if (!m_reader)
-            m_reader = std::make_unique<QSettings>(m_fileName, QSettings::IniFormat);
+        return m_plainFile->value(section, key, value) ? value : defaultValue;
     }
     if (!m_reader) {
         logTrace(3, QStringLiteral("QProjectController::writeProperty: file %s doesn't exist"), m_fileName);
@@ -173,12 +165,7 @@ QString QProjectController::readProperty(QString section, QString key, QString d
 QString QProjectController::storeValue(const QString &address, const QString &defaultValue)
 {
     const QVariant value = m_reader->value(address);
-    if (!value.isValid())
-        return defaultValue;
-    // A hand-edited line with unquoted commas reads as a list; keep its text.
-    if (value.type() == QVariant::StringList)
-        return value.toStringList().join(QLatin1Char(','));
-    return value.toString();
+    return value.isValid() ? settingsValueText(value) : defaultValue;
 }
 
 bool QProjectController::closeProjectFile()

@@ -10,9 +10,9 @@ class QSettings;
 
 // The ini container used by projects and altitude presets: one writer or one
 // reader at a time, in the format of QSettings::IniFormat. A new file is written
-// and a plain file read by our own code, which gives the same bytes and values at
-// a fraction of the cost; adding to an existing file and reading anything unusual
-// go through QSettings itself.
+// and a plain file (LF or CRLF lines) read by our own code, which gives the same
+// bytes and values at a fraction of the cost; adding to an existing file and
+// reading anything unusual go through QSettings itself.
 class QProjectController : public ProjectController
 {
 public:
