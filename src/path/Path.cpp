@@ -4,6 +4,7 @@
 #include "path/CurveGenerator.h"
 #include "path/GeoDistance.h"
 #include "path/IdCounter.h"
+#include "path/NearestSample.h"
 #include "project/ProjectController.h"
 #include "project/ValueParsers.h"
 
@@ -11,6 +12,8 @@
 
 #include <cmath>
 #include <limits>
+#include <memory>
+#include <unordered_map>
 #include <unordered_set>
 
 namespace {
@@ -394,25 +397,36 @@ std::vector<Path::MediaAnchor> Path::collectMediaAnchors(bool keepPosition) cons
 
 void Path::restoreMediaAnchors(const std::vector<MediaAnchor> &anchors)
 {
+    // Made when first needed: one search of the whole curve per media point would
+    // not scale to long routes with many photos.
+    std::unique_ptr<NearestSample> nearest;
+    std::unordered_map<uint32_t, int> keyPointSamples;
+    bool keyPointsIndexed = false;
+    const auto sampleNaming = [&](uint32_t keyPointId) {
+        if (!keyPointsIndexed) {
+            keyPointsIndexed = true;
+            for (size_t i = curvePoints.size(); i-- > 0;) {
+                if (curvePoints[i].correspondingKeyPoint != 0)
+                    keyPointSamples[curvePoints[i].correspondingKeyPoint] = int(i);
+            }
+        }
+        const auto found = keyPointSamples.find(keyPointId);
+        return keyPointId != 0 && found != keyPointSamples.end() ? found->second : -1;
+    };
+    const double farthest = GeoDistanceFrom::metresToTerm(1e7);
     for (const MediaAnchor &anchor : anchors) {
         MediaPoint *media = anchor.mediaPointId ? mediaPointById(anchor.mediaPointId) : nullptr;
         if (!media)
             continue;
         int sample = -1;
         if (anchor.keepPosition) {
-            GeoDistanceFrom from(anchor.y, anchor.x);
-            double best = GeoDistanceFrom::metresToTerm(1e7);
-            for (size_t i = 0; i < curvePoints.size(); ++i) {
-                const double d = from.term(curvePoints[i].y, curvePoints[i].x);
-                if (d < best) {
-                    best = d;
-                    sample = int(i);
-                }
-            }
+            if (!nearest)
+                nearest = std::make_unique<NearestSample>(curvePoints);
+            sample = nearest->find(anchor.y, anchor.x, farthest);
         } else if (anchor.sameSampleKeyPoint != 0) {
-            sample = curvePointIndexNaming(anchor.sameSampleKeyPoint);
+            sample = sampleNaming(anchor.sameSampleKeyPoint);
         } else {
-            const int start = curvePointIndexNaming(anchor.keyPointId);
+            const int start = sampleNaming(anchor.keyPointId);
             if (start >= 0 && start + anchor.offset >= 0 && size_t(start + anchor.offset) < curvePoints.size())
                 sample = start + anchor.offset;
         }
