@@ -99,6 +99,12 @@ private slots:
             Path same = makePath(mode, {{7, 8}, {7, 8}});
             QCOMPARE(same.curvePoints.size(), size_t(1));
             QCOMPARE(same.curvePoints.front().correspondingKeyPoint, same.keyPoints.front().id);
+            // A doubled key point beside a leg leaves that leg's samples numbers.
+            for (const Path &doubled : {makePath(mode, {{7, 8}, {7, 8}, {9, 9}}), makePath(mode, {{5, 5}, {7, 8}, {7, 8}})}) {
+                QVERIFY(doubled.curvePoints.size() > 200);
+                for (const CurvePoint &c : doubled.curvePoints)
+                    QVERIFY(std::isfinite(c.x) && std::isfinite(c.y));
+            }
         }
 
         Path airplane = makePath(CurveMode::Arc, {{0, 0}, {10, 10}, {20, 0}});

@@ -616,6 +616,26 @@ private slots:
         QCOMPARE(readBytes(b), readBytes(a));
     }
 
+    // Projects found by fuzzing: each opens, and what it saves opens again.
+    void fuzzFindsOpenAfterSaving_data()
+    {
+        QTest::addColumn<QString>("file");
+        for (const QFileInfo &found : QDir(QStringLiteral(TOURLET_TEST_DATA)).entryInfoList({QStringLiteral("*.zkgeo")}))
+            QTest::newRow(qPrintable(found.fileName())) << found.filePath();
+    }
+
+    void fuzzFindsOpenAfterSaving()
+    {
+        QFETCH(QString, file);
+        PainterPathRenderer_Controller doc;
+        QCOMPARE(int(openDocumentFile(doc, file).status), int(DocumentOpenResult::Status::Project));
+        const QString saved = path(QStringLiteral("fuzz find.zkgeo"));
+        QVERIFY(saveDocumentFile(doc, saved));
+        PainterPathRenderer_Controller again;
+        QCOMPARE(int(openDocumentFile(again, saved).status), int(DocumentOpenResult::Status::Project));
+        QCOMPARE(again.pathManager().activeChecked().curvePoints.size(), doc.pathManager().activeChecked().curvePoints.size());
+    }
+
     void damagedAndForeignFiles()
     {
         PainterPathRenderer_Controller doc;
