@@ -13,11 +13,6 @@ namespace {
 
 constexpr size_t fanOut = 32;
 
-bool validCoordinate(double lat, double lon)
-{
-    return lat >= -90.0 && lat <= 90.0 && lon >= -180.0 && lon <= 180.0;
-}
-
 double halfAngleTerm(double degrees)
 {
     const double s = std::sin(qDegreesToRadians(degrees) / 2.0);
@@ -42,7 +37,7 @@ NearestSample::NearestSample(const std::vector<CurvePoint> &samples) : m_samples
     for (size_t i = 0; i < samples.size(); ++i) {
         Box &box = level[i / fanOut];
         const double lat = samples[i].y, lon = samples[i].x;
-        if (!validCoordinate(lat, lon)) {
+        if (!isValidCoordinate(lat, lon)) {
             box.hasInvalid = true;
             continue;
         }
