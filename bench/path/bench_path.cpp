@@ -49,11 +49,17 @@ void hitTestCurve(benchmark::State &state)
 }
 BENCHMARK(hitTestCurve)->Unit(benchmark::kMillisecond);
 
+// range(0) media points spread over the route, which keep their places.
 void insertKeyPoint(benchmark::State &state)
 {
     qInstallMessageHandler([](QtMsgType, const QMessageLogContext &, const QString &) {});
     Path path = continentPath(1000);
     path.update(true);
+    const size_t mediaCount = size_t(state.range(0));
+    for (size_t i = 0; i < mediaCount; ++i) {
+        const CurvePoint &sample = path.curvePoints[(i * 2 + 1) * path.curvePoints.size() / (2 * mediaCount)];
+        path.addMediaPoint(MediaPoint(sample.x, sample.y, 0), 0, false);
+    }
     for (auto _ : state) {
         state.PauseTiming();
         const uint32_t after = path.keyPoints[500].id;
@@ -66,7 +72,7 @@ void insertKeyPoint(benchmark::State &state)
         state.ResumeTiming();
     }
 }
-BENCHMARK(insertKeyPoint)->Unit(benchmark::kMillisecond);
+BENCHMARK(insertKeyPoint)->Arg(0)->Arg(100)->Arg(400)->Unit(benchmark::kMillisecond);
 
 } // namespace
 

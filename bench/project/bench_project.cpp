@@ -106,6 +106,40 @@ void loadProject(benchmark::State &state)
 }
 BENCHMARK(loadProject)->Arg(2)->Arg(3)->Unit(benchmark::kMillisecond)->Iterations(3);
 
+// An ordinary route of 1000 key points (about 200,000 samples) with range(0) media
+// points, saved once and loaded: the media points find their samples again.
+void loadRouteWithPhotos(benchmark::State &state)
+{
+    quiet();
+    QTemporaryDir dir;
+    const QString file = dir.filePath(QStringLiteral("route.zkgeo"));
+    {
+        PainterPathRenderer_Controller doc;
+        Path &path = doc.pathManager().activeChecked();
+        for (int i = 0; i < 1000; ++i) {
+            const double t = i / 1000.0;
+            path.addKeyPoint(-10 + 40 * t + std::sin(i * 0.7) * 0.4, 40 + 15 * std::sin(t * 6.28), 0.0, QString(), i == 999);
+        }
+        const size_t mediaCount = size_t(state.range(0));
+        for (size_t i = 0; i < mediaCount; ++i) {
+            const CurvePoint &sample = path.curvePoints[(i * 2 + 1) * path.curvePoints.size() / (2 * mediaCount)];
+            path.addMediaPoint(MediaPoint(sample.x, sample.y, 0), 0, false);
+        }
+        if (!saveDocumentFile(doc, file)) {
+            state.SkipWithError("project not made");
+            return;
+        }
+    }
+    PainterPathRenderer_Controller doc;
+    for (auto _ : state) {
+        if (openDocumentFile(doc, file).status != DocumentOpenResult::Status::Project)
+            state.SkipWithError("load failed");
+    }
+    state.counters["curvePoints"] = double(doc.pathManager().activeChecked().curvePoints.size());
+    state.counters["mediaPoints"] = double(doc.pathManager().activeChecked().mediaPoints.size());
+}
+BENCHMARK(loadRouteWithPhotos)->Arg(0)->Arg(400)->Unit(benchmark::kMillisecond)->Iterations(3);
+
 // Reading and converting the track itself, for comparison.
 void openTrack(benchmark::State &state)
 {

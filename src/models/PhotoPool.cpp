@@ -3,6 +3,7 @@
 #include "app/Trace.h"
 #include "path/ContentPath.h"
 #include "path/PointRecord.h"
+#include "project/ProjectController.h"
 
 #include <QFileInfo>
 #include <QImage>
@@ -120,14 +121,11 @@ void PhotoPool::Load(ProjectController &store)
     PointRecordReader(store, poolSection).read(QStringLiteral("size"), size);
     if (size > 0)
         photos.clear();
-    for (int32_t i = 0; i < size; ++i) {
-        const QString section = photoPoolItemSection(i);
-        const PointRecordReader in(store, section);
-        // Every saved item has a path; a count beyond the stored items is damage.
-        if (!in.has(QStringLiteral("path"))) {
-            logTrace(3, QStringLiteral("PhotoPool::Load -> section %s missing, %d of %d photos read"), section, i, size);
-            break;
-        }
+    const std::vector<int32_t> present = store.numberedSections(poolSection + QStringLiteral("_item"), size);
+    if (present.size() != size_t(std::max(size, 0)))
+        logTrace(3, QStringLiteral("PhotoPool::Load -> %d of %d photo sections present"), int(present.size()), size);
+    for (const int32_t i : present) {
+        const PointRecordReader in(store, photoPoolItemSection(i));
         PoolPhoto photo;
         photo.id = drawPhotoId();
         in.read(QStringLiteral("flags"), photo.flags);

@@ -1,14 +1,12 @@
 #include "path/BasePoint.h"
 
+#include "path/IdCounter.h"
 #include "path/PointRecord.h"
-
-namespace {
-uint32_t g_nextPointId = 1;
-}
 
 uint32_t drawPointId()
 {
-    return g_nextPointId++;
+    static IdCounter counter;
+    return counter.draw();
 }
 
 BasePoint::BasePoint() : id(drawPointId()) {}
@@ -51,9 +49,9 @@ bool BasePoint::Save(ProjectController &store, QString section) const
 bool BasePoint::Load(ProjectController &store, QString section)
 {
     const PointRecordReader in(store, section);
-    in.read(QStringLiteral("x"), x);
-    in.read(QStringLiteral("y"), y);
-    in.read(QStringLiteral("z"), z);
+    in.readCoordinate(QStringLiteral("x"), x);
+    in.readCoordinate(QStringLiteral("y"), y);
+    in.readCoordinate(QStringLiteral("z"), z);
     in.read(QStringLiteral("tt"), tt);
     return true;
 }

@@ -37,8 +37,8 @@ protected:
     void makeEmpty();
 };
 
-// Index written to the file for a reference that names nothing.
-// The next id of the counter that all point kinds share; first value 1.
+// The next id of the counter that all point kinds share; first value 1, never 0.
 uint32_t drawPointId();
 
+// Index written to the file for a reference that names nothing.
 constexpr uint32_t noPointIndex = 0xFFFFFFFFu;

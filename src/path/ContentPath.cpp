@@ -37,7 +37,7 @@ QString rebaseContentPath(const QString &stored)
 {
     const int at = contentFolderPosition(stored);
     const QString folder = programFolder();
-    if (at < 0 || folder.isEmpty())
+    if (at < 0 || folder.isEmpty() || QFileInfo::exists(localFilePath(stored)))
         return stored;
 
     QString rest = stored.mid(at);

@@ -141,9 +141,11 @@ QPointF Spline::at(int j) const
     // exactly `steps`, whatever the rounding of the sum.
     const double t = m_t1 + j * m_step;
     const double t1 = m_t1, t2 = m_t2, t3 = m_t3;
-    const QPointF a1 = ((t1 - t) / t1) * m_p0 + (t / t1) * m_p1;
+    // A neighbouring key point on the same spot as an end of the leg gives a knot
+    // interval of 0; the blend of two equal points is that point, not 0 / 0.
+    const QPointF a1 = t1 > 0 ? ((t1 - t) / t1) * m_p0 + (t / t1) * m_p1 : m_p1;
     const QPointF a2 = ((t2 - t) / (t2 - t1)) * m_p1 + ((t - t1) / (t2 - t1)) * m_p2;
-    const QPointF a3 = ((t3 - t) / (t3 - t2)) * m_p2 + ((t - t2) / (t3 - t2)) * m_p3;
+    const QPointF a3 = t3 > t2 ? ((t3 - t) / (t3 - t2)) * m_p2 + ((t - t2) / (t3 - t2)) * m_p3 : m_p2;
     const QPointF b1 = ((t2 - t) / t2) * a1 + (t / t2) * a2;
     const QPointF b2 = ((t3 - t) / (t3 - t1)) * a2 + ((t - t1) / (t3 - t1)) * a3;
     return ((t2 - t) / (t2 - t1)) * b1 + ((t - t1) / (t2 - t1)) * b2;

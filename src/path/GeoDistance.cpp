@@ -8,28 +8,28 @@
 
 namespace {
 constexpr double earthMeanRadiusKm = 6371.0072;
+}
 
-bool validCoordinate(double lat, double lon)
+bool isValidCoordinate(double lat, double lon)
 {
     return lat >= -90.0 && lat <= 90.0 && lon >= -180.0 && lon <= 180.0;
-}
 }
 
 double geoDistance(double lat1, double lon1, double lat2, double lon2)
 {
-    if (!validCoordinate(lat1, lon1) || !validCoordinate(lat2, lon2))
+    if (!isValidCoordinate(lat1, lon1) || !isValidCoordinate(lat2, lon2))
         return 0.0;
     return GeoDistanceFrom::termToMetres(GeoDistanceFrom(lat1, lon1).term(lat2, lon2));
 }
 
 GeoDistanceFrom::GeoDistanceFrom(double lat, double lon)
-    : m_lat(lat), m_lon(lon), m_cosLat(std::cos(qDegreesToRadians(lat))), m_valid(validCoordinate(lat, lon))
+    : m_lat(lat), m_lon(lon), m_cosLat(std::cos(qDegreesToRadians(lat))), m_valid(isValidCoordinate(lat, lon))
 {
 }
 
 double GeoDistanceFrom::term(double lat, double lon) const
 {
-    if (!m_valid || !validCoordinate(lat, lon))
+    if (!m_valid || !isValidCoordinate(lat, lon))
         return 0.0; // as the distance of invalid coordinates: 0
     double hLat = std::sin(qDegreesToRadians(lat - m_lat) / 2.0);
     hLat *= hLat;

@@ -1,5 +1,8 @@
 #pragma once
 
+// Latitude within [-90, 90] and longitude within [-180, 180]; false for NaN.
+bool isValidCoordinate(double lat, double lon);
+
 // Great-circle distance in metres between (lat, lon) pairs in degrees, computed as
 // QGeoCoordinate::distanceTo does; invalid coordinates give 0.
 double geoDistance(double lat1, double lon1, double lat2, double lon2);

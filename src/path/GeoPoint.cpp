@@ -38,9 +38,9 @@ void GeoPoint::saveGeo(const PointRecordWriter &out) const
 
 void GeoPoint::loadGeo(const PointRecordReader &in)
 {
-    in.read(QStringLiteral("longitude"), longitude);
-    in.read(QStringLiteral("latitude"), latitude);
-    in.read(QStringLiteral("altitude"), altitude);
+    in.readCoordinate(QStringLiteral("longitude"), longitude);
+    in.readCoordinate(QStringLiteral("latitude"), latitude);
+    in.readCoordinate(QStringLiteral("altitude"), altitude);
     in.read(QStringLiteral("name"), name);
     in.read(QStringLiteral("type"), type);
 }

@@ -3,6 +3,7 @@
 #include "app/Trace.h"
 #include "path/DefaultTitle.h"
 #include "path/PointRecord.h"
+#include "project/ProjectController.h"
 
 namespace {
 const QString listSection = QStringLiteral("keypoints");
@@ -13,7 +14,8 @@ QString keyPointSection(int index)
     return QStringLiteral("keypoint%1").arg(index);
 }
 
-bool loadKeyPoints(ProjectController &store, uint32_t projectVersion, QVector<KeyPoint> &out)
+bool loadKeyPoints(ProjectController &store, uint32_t projectVersion, QVector<KeyPoint> &out,
+                   std::vector<int32_t> *numbers)
 {
     const PointRecordReader list(store, listSection);
     int32_t count = 0;
@@ -34,21 +36,21 @@ bool loadKeyPoints(ProjectController &store, uint32_t projectVersion, QVector<Ke
         list.read(QStringLiteral("size"), sharedSize);
     }
 
-    for (int32_t i = 0; i < count; ++i) {
-        const QString section = keyPointSection(i);
-        // Every saved key point has "x"; a count beyond the stored sections is damage.
-        if (!PointRecordReader(store, section).has(QStringLiteral("x"))) {
-            logTrace(3, QStringLiteral("loadKeyPoints -> section %s missing, %d of %d key points read"), section, i, count);
-            break;
-        }
+    const std::vector<int32_t> present = store.numberedSections(QStringLiteral("keypoint"), count);
+    if (present.size() != size_t(count))
+        logTrace(3, QStringLiteral("loadKeyPoints -> %d of %d key point sections present"), int(present.size()), count);
+    out.reserve(out.size() + int(present.size()));
+    for (const int32_t i : present) {
         KeyPoint point;
         if (sharedLook) {
             point.properties.font = sharedFont;
             point.properties.size = sharedSize;
         }
-        point.Load(store, section);
+        point.Load(store, keyPointSection(i));
         out.append(std::move(point));
     }
+    if (numbers)
+        *numbers = present;
     return true;
 }
 

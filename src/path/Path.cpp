@@ -3,6 +3,8 @@
 #include "app/Trace.h"
 #include "path/CurveGenerator.h"
 #include "path/GeoDistance.h"
+#include "path/IdCounter.h"
+#include "path/NearestSample.h"
 #include "project/ProjectController.h"
 #include "project/ValueParsers.h"
 
@@ -10,14 +12,16 @@
 
 #include <cmath>
 #include <limits>
+#include <memory>
+#include <unordered_map>
 #include <unordered_set>
 
 namespace {
 
 uint32_t nextPathIdentifier()
 {
-    static uint32_t counter = 1;
-    return counter++;
+    static IdCounter counter;
+    return counter.draw();
 }
 
 template <typename Points>
@@ -391,25 +395,36 @@ std::vector<Path::MediaAnchor> Path::collectMediaAnchors(bool keepPosition) cons
 
 void Path::restoreMediaAnchors(const std::vector<MediaAnchor> &anchors)
 {
+    // Made when first needed: one search of the whole curve per media point would
+    // not scale to long routes with many photos.
+    std::unique_ptr<NearestSample> nearest;
+    std::unordered_map<uint32_t, int> keyPointSamples;
+    bool keyPointsIndexed = false;
+    const auto sampleNaming = [&](uint32_t keyPointId) {
+        if (!keyPointsIndexed) {
+            keyPointsIndexed = true;
+            for (size_t i = curvePoints.size(); i-- > 0;) {
+                if (curvePoints[i].correspondingKeyPoint != 0)
+                    keyPointSamples[curvePoints[i].correspondingKeyPoint] = int(i);
+            }
+        }
+        const auto found = keyPointSamples.find(keyPointId);
+        return keyPointId != 0 && found != keyPointSamples.end() ? found->second : -1;
+    };
+    const double farthest = GeoDistanceFrom::metresToTerm(1e7);
     for (const MediaAnchor &anchor : anchors) {
         MediaPoint *media = anchor.mediaPointId ? mediaPointById(anchor.mediaPointId) : nullptr;
         if (!media)
             continue;
         int sample = -1;
         if (anchor.keepPosition) {
-            GeoDistanceFrom from(anchor.y, anchor.x);
-            double best = GeoDistanceFrom::metresToTerm(1e7);
-            for (size_t i = 0; i < curvePoints.size(); ++i) {
-                const double d = from.term(curvePoints[i].y, curvePoints[i].x);
-                if (d < best) {
-                    best = d;
-                    sample = int(i);
-                }
-            }
+            if (!nearest)
+                nearest = std::make_unique<NearestSample>(curvePoints);
+            sample = nearest->find(anchor.y, anchor.x, farthest);
         } else if (anchor.sameSampleKeyPoint != 0) {
-            sample = curvePointIndexNaming(anchor.sameSampleKeyPoint);
+            sample = sampleNaming(anchor.sameSampleKeyPoint);
         } else {
-            const int start = curvePointIndexNaming(anchor.keyPointId);
+            const int start = sampleNaming(anchor.keyPointId);
             if (start >= 0 && start + anchor.offset >= 0 && size_t(start + anchor.offset) < curvePoints.size())
                 sample = start + anchor.offset;
         }
@@ -659,14 +674,14 @@ bool Path::LoadCurvePoints(ProjectController &store, const QString &section)
 {
     int32_t count = 0;
     initInt(store.readProperty(section, QStringLiteral("elements"), QString()), count);
-    for (int i = 0; i < count; ++i) {
-        const QString pointSection = QStringLiteral("curvepoint%1").arg(i);
-        // A damaged count must not make up samples: the list ends at its first missing record.
-        if (store.readProperty(pointSection, QStringLiteral("x"), QString()).isEmpty())
-            break;
+    const std::vector<int32_t> present = store.numberedSections(QStringLiteral("curvepoint"), count);
+    if (present.size() != size_t(std::max(count, 0)))
+        logTrace(3, QStringLiteral("Path::LoadCurvePoints -> %d of %d sections present"), int(present.size()), count);
+    curvePoints.reserve(curvePoints.size() + present.size());
+    for (const int32_t i : present) {
         CurvePoint p;
-        p.Load(store, pointSection);
-        curvePoints.push_back(p);
+        p.Load(store, QStringLiteral("curvepoint%1").arg(i));
+        curvePoints.push_back(std::move(p));
     }
     return true;
 }

@@ -1,5 +1,8 @@
 #include "path/PathSegment.h"
 
+#include "app/Trace.h"
+#include "path/ContentPath.h"
+#include "path/IdCounter.h"
 #include "project/ProjectController.h"
 #include "project/ValueParsers.h"
 
@@ -8,8 +11,8 @@ namespace {
 
 uint32_t nextSegmentId()
 {
-    static uint32_t counter = 1;
-    return counter++;
+    static IdCounter counter;
+    return counter.draw();
 }
 
 PilotProperties &defaultPilotRecord()
@@ -55,8 +58,11 @@ void PilotProperties::Load(ProjectController &store, const QString &section)
         setFlag(rotation, on);
     if (initBool(store.readProperty(section, key("pilot_symmetric"), QString()), on))
         setFlag(symmetric, on);
-    initString(store.readProperty(section, key("pilot_source"), QString()), source);
-    initString(store.readProperty(section, key("pilot_thumb"), QString()), thumb);
+    // Avatars of the catalogue live in the installation the project was saved with.
+    if (initString(store.readProperty(section, key("pilot_source"), QString()), source))
+        source = rebaseContentPath(source);
+    if (initString(store.readProperty(section, key("pilot_thumb"), QString()), thumb))
+        thumb = rebaseContentPath(thumb);
     initString(store.readProperty(section, key("pilot_displayFormat"), QString()), displayFormat);
     initDouble(store.readProperty(section, key("pilot_width"), QString()), width);
 }
@@ -117,9 +123,14 @@ void PathSegment::remapCorrespondingIds(const std::vector<KeyPoint> &keyPoints, 
     }
 }
 
+QString PathSegment::sampleStem(const QString &section)
+{
+    return section + QLatin1String("curvepoint");
+}
+
 QString PathSegment::sampleSection(const QString &section, int index)
 {
-    return section + QLatin1String("curvepoint") + QString::number(index);
+    return sampleStem(section) + QString::number(index);
 }
 
 void PathSegment::saveHeader(ProjectController &store, const QString &section) const
@@ -134,14 +145,14 @@ bool PathSegment::Load(ProjectController &store, const QString &section)
     int32_t count = 0;
     initInt(store.readProperty(section, key("curvepoints"), QString()), count);
     curvePoints.clear();
-    for (int i = 0; i < count; ++i) {
-        // A damaged count must not make up samples: the list ends at its first missing record.
-        const QString sample = sampleSection(section, i);
-        if (store.readProperty(sample, key("x"), QString()).isEmpty())
-            break;
+    const std::vector<int32_t> present = store.numberedSections(sampleStem(section), count);
+    if (present.size() != size_t(std::max(count, 0)))
+        logTrace(3, QStringLiteral("PathSegment::Load[%s] -> %d of %d samples present"), section, int(present.size()), count);
+    curvePoints.reserve(present.size());
+    for (const int32_t i : present) {
         CurvePoint p;
-        p.Load(store, sample);
-        curvePoints.push_back(p);
+        p.Load(store, sampleSection(section, i));
+        curvePoints.push_back(std::move(p));
     }
     return true;
 }

@@ -68,6 +68,7 @@ public:
 
 private:
     void saveHeader(ProjectController &store, const QString &section) const;
+    static QString sampleStem(const QString &section);
     static QString sampleSection(const QString &section, int index);
 };
 

@@ -3,6 +3,8 @@
 #include "project/ProjectController.h"
 #include "project/ValueParsers.h"
 
+#include <cmath>
+
 QString PointRecordReader::text(const QString &key) const
 {
     return m_store.readProperty(m_section, key, QString());
@@ -11,6 +13,17 @@ QString PointRecordReader::text(const QString &key) const
 bool PointRecordReader::read(const QString &key, double &out) const
 {
     return initDouble(text(key), out);
+}
+
+bool PointRecordReader::readCoordinate(const QString &key, double &out) const
+{
+    double value = 0.0;
+    if (!initDouble(text(key), value))
+        return false;
+    if (!std::isfinite(value))
+        throw DamagedNumberError(DamagedNumberError::Kind::InvalidArgument, "coordinate is not a finite number");
+    out = value;
+    return true;
 }
 
 bool PointRecordReader::read(const QString &key, int32_t &out) const

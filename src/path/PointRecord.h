@@ -15,9 +15,10 @@ public:
     PointRecordReader(ProjectController &store, const QString &section) : m_store(store), m_section(section) {}
 
     QString text(const QString &key) const;
-    bool has(const QString &key) const { return !text(key).isEmpty(); }
 
     bool read(const QString &key, double &out) const;
+    // A coordinate must be a finite number: "nan" or "inf" is damage, as in a track file.
+    bool readCoordinate(const QString &key, double &out) const;
     bool read(const QString &key, int32_t &out) const;
     bool read(const QString &key, uint32_t &out) const;
     bool read(const QString &key, bool &out) const;

@@ -1,5 +1,7 @@
 #include "project/IniFileReader.h"
 
+#include "project/SettingsValue.h"
+
 #include <QStringList>
 
 #include <cstring>
@@ -25,6 +27,13 @@ bool isPlainName(const char *p, int length)
 bool isSpace(char c)
 {
     return c == ' ' || c == '\t';
+}
+
+// Where the text of a line ends: before the '\n', and before a '\r' that comes
+// with it, as files from Windows have them.
+qint64 textEnd(const char *p, qint64 lineStart, qint64 lineEnd)
+{
+    return lineEnd > lineStart && p[lineEnd - 1] == '\r' ? lineEnd - 1 : lineEnd;
 }
 
 void chopTrailingSpaces(QString &text, int limit)
@@ -153,9 +162,9 @@ bool IniFileReader::parse(const char *p, qint64 size)
     qint64 pos = 0;
     while (pos < size) {
         const char *newline = static_cast<const char *>(std::memchr(p + pos, '\n', size_t(size - pos)));
-        const qint64 lineEnd = newline ? qint64(newline - p) : size;
+        const qint64 lineEnd = textEnd(p, pos, newline ? qint64(newline - p) : size);
         qint64 start = pos;
-        pos = lineEnd + 1;
+        pos = (newline ? qint64(newline - p) : size) + 1;
         while (start < lineEnd && isSpace(p[start]))
             ++start;
         if (start == lineEnd)
@@ -198,13 +207,13 @@ bool IniFileReader::parse(const char *p, qint64 size)
     return true;
 }
 
-IniFileReader::Lookup IniFileReader::value(const QString &section, const QString &key, QString &out) const
+bool IniFileReader::value(const QString &section, const QString &key, QString &out) const
 {
     char sectionName[256], keyName[256];
     int sectionLength = 0, keyLength = 0;
     if (!latin1(section, sectionName, int(sizeof sectionName), sectionLength)
         || !latin1(key, keyName, int(sizeof keyName), keyLength))
-        return Lookup::Missing;
+        return false;
     // A record's keys are read one after another: most lookups stay in the section
     // of the one before.
     const Section *found = m_cached;
@@ -212,7 +221,7 @@ IniFileReader::Lookup IniFileReader::value(const QString &section, const QString
         || std::memcmp(m_data + found->name, sectionName, size_t(sectionLength)) != 0)
         found = find(sectionName, uint32_t(sectionLength));
     if (!found)
-        return Lookup::Missing;
+        return false;
 
     const char *p = m_data;
     if (m_cached != found) {
@@ -221,9 +230,9 @@ IniFileReader::Lookup IniFileReader::value(const QString &section, const QString
         qint64 pos = found->begin;
         while (pos < found->end) {
             const char *newline = static_cast<const char *>(std::memchr(p + pos, '\n', size_t(found->end - pos)));
-            const qint64 lineEnd = newline ? qint64(newline - p) : found->end;
+            const qint64 lineEnd = textEnd(p, pos, newline ? qint64(newline - p) : found->end);
             qint64 start = pos;
-            pos = lineEnd + 1;
+            pos = (newline ? qint64(newline - p) : found->end) + 1;
             while (start < lineEnd && isSpace(p[start]))
                 ++start;
             if (start == lineEnd)
@@ -241,7 +250,7 @@ IniFileReader::Lookup IniFileReader::value(const QString &section, const QString
         }
     }
     if (from < 0)
-        return Lookup::Missing;
+        return false;
 
     // Most values are plain text: no escapes, quotes, lists or blanks at the ends.
     bool plain = to == from || (!isSpace(p[from]) && !isSpace(p[to - 1]));
@@ -249,27 +258,26 @@ IniFileReader::Lookup IniFileReader::value(const QString &section, const QString
         const char c = p[i];
         plain = c != '\\' && c != '"' && c != ',' && uchar(c) < 0x80;
     }
-    if (plain) {
-        if (to > from && p[from] == '@')
-            return Lookup::NeedsStore;
+    if (plain && (to == from || p[from] != '@')) {
         out = QString::fromLatin1(p + from, int(to - from));
-        return Lookup::Found;
+        return true;
     }
 
     QString text;
     QStringList list;
-    if (unescapeValue(p, from, to, text, list)) {
-        for (const QString &item : list) {
-            if (item.startsWith(QLatin1Char('@')))
-                return Lookup::NeedsStore;
-        }
-        out = list.join(QLatin1Char(','));
-        return Lookup::Found;
+    const QVariant typed = unescapeValue(p, from, to, text, list) ? settingsValue(list) : settingsValue(text);
+    if (!typed.isValid())
+        return false;
+    out = settingsValueText(typed);
+    return true;
+}
+
+void IniFileReader::listSections(NumberedSections &out) const
+{
+    for (const Section &s : m_sections) {
+        if (s.end > s.begin)
+            out.add(m_data + s.name, int(s.nameLength));
     }
-    if (text.startsWith(QLatin1Char('@')))
-        return Lookup::NeedsStore;
-    out = text;
-    return Lookup::Found;
 }
 
 bool IniFileReader::unescapeValue(const char *str, qint64 from, qint64 to, QString &text, QStringList &list)

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/LargeBuffer.h"
+#include "project/NumberedSections.h"
 
 #include <QByteArray>
 #include <QString>
@@ -10,23 +11,26 @@
 #include <vector>
 
 // Reads the settings ini format as QSettings::IniFormat reads it, for the files that
-// this program writes and files of the same plain shape. `parse` declines (false)
-// any file whose lines it can't read exactly as the store would: comments, keys or
-// section names with escapes, lines that continue, keys outside a section, repeated
-// sections. The caller then reads that file through QSettings.
+// this program writes and files of the same plain shape, with LF or CRLF line
+// ends. `parse` declines (false) any file whose lines it can't read exactly as the
+// store would: comments, keys or section names with escapes, lines that continue,
+// keys outside a section, repeated sections, a carriage return inside a line. The
+// caller then reads that file through QSettings.
 class IniFileReader
 {
 public:
-    enum class Lookup { Found, Missing, NeedsStore };
-
     // The bytes must stay valid while the reader is used.
     bool parse(const char *data, qint64 size);
     bool parse(const QByteArray &data);
     bool parse(LargeBuffer &&data);
 
-    // The value as text, lists joined with ','. NeedsStore for a value that reads as
-    // a typed one (a leading '@'), which only the store itself knows how to convert.
-    Lookup value(const QString &section, const QString &key, QString &out) const;
+    // The value as the container reads it through the store: text, lists joined
+    // with ',', typed values (a leading '@') converted. False when the key is
+    // missing or its value is "@Invalid()".
+    bool value(const QString &section, const QString &key, QString &out) const;
+
+    // Adds every section that holds a key.
+    void listSections(NumberedSections &out) const;
 
     // The value part of a line, unescaped and unquoted; true when it holds a list.
     static bool unescapeValue(const char *data, qint64 from, qint64 to, QString &text, QStringList &list);

@@ -67,6 +67,11 @@ QString ProjectController::readProperty(QString, QString, QString defaultValue)
     return defaultValue;
 }
 
+std::vector<int32_t> ProjectController::numberedSections(QString, int32_t)
+{
+    return {};
+}
+
 bool ProjectController::closeProjectFile()
 {
     m_outStream.close();

@@ -4,6 +4,7 @@
 
 #include <cstdint>
 #include <fstream>
+#include <vector>
 
 // The project/preset file container. Callers address values by section and key;
 // the schema lives in the classes that save and load themselves through it.
@@ -23,6 +24,10 @@ public:
     virtual bool writeProperty(QString section, QString key, QString value);
     virtual QString readProperty(QString section, QString key, QString defaultValue);
     virtual bool closeProjectFile();
+    // The numbers n below `count`, ascending, for which a section `stem` + n holds
+    // a key: the entries of a list stored as "keypoint0", "keypoint1", ... that a
+    // file has, even when one in the middle is gone.
+    virtual std::vector<int32_t> numberedSections(QString stem, int32_t count);
 
     uint32_t projectVersion() const { return m_projectVersion; }
     const QString &fileName() const { return m_fileName; }

@@ -6,6 +6,8 @@
 #include "project/PainterPathRenderer_Controller.h"
 #include "project/ValueParsers.h"
 
+#include <algorithm>
+
 namespace {
 
 const QString animator = QStringLiteral("animator");
@@ -21,6 +23,26 @@ int32_t parsePathValue(const QString &text)
         value = 0;
     }
     return value;
+}
+
+// The samples name key points and media points by the number of their section.
+// Where a section in the middle is missing the loaded list is shorter, and the
+// numbers become positions in it; a number without a loaded point names none.
+void renumberReferences(Path &path, uint32_t CurvePoint::*reference, const std::vector<int32_t> &numbers)
+{
+    if (numbers.empty() || numbers.back() == int32_t(numbers.size()) - 1)
+        return;
+    const auto position = [&](uint32_t number) {
+        const auto at = std::lower_bound(numbers.begin(), numbers.end(), int64_t(number),
+                                         [](int32_t a, int64_t b) { return int64_t(a) < b; });
+        return at != numbers.end() && *at == int64_t(number) ? uint32_t(at - numbers.begin()) : noPointIndex;
+    };
+    for (CurvePoint &p : path.curvePoints)
+        p.*reference = position(p.*reference);
+    for (PathSegment &segment : path.pathSegments) {
+        for (CurvePoint &p : segment.curvePoints)
+            p.*reference = position(p.*reference);
+    }
 }
 
 } // namespace
@@ -44,8 +66,10 @@ void ProjectLoader::read()
         path->LoadCurvePoints(m_store, QStringLiteral("curvepoints"));
 
     readGeometry();
-    readKeyPoints();
+    const std::vector<int32_t> keyPointNumbers = readKeyPoints();
     readSegments();
+    if (path)
+        renumberReferences(*path, &CurvePoint::correspondingKeyPoint, keyPointNumbers);
     readMediaPoints();
 
     initBool(text(QStringLiteral("exporter"), QStringLiteral("fileNameChangedByUser")),
@@ -200,17 +224,19 @@ void ProjectLoader::readGeometry()
     f.pseudoMapCenter.Load(m_store, QStringLiteral("pseudomap_center"));
 }
 
-void ProjectLoader::readKeyPoints()
+std::vector<int32_t> ProjectLoader::readKeyPoints()
 {
     Path *path = m_document.pathManager().active();
     if (!path)
-        return;
+        return {};
     QVector<KeyPoint> keyPoints;
-    loadKeyPoints(m_store, m_store.projectVersion(), keyPoints);
+    std::vector<int32_t> numbers;
+    loadKeyPoints(m_store, m_store.projectVersion(), keyPoints, &numbers);
     path->keyPoints.reserve(path->keyPoints.size() + size_t(keyPoints.size()));
     // Only the last key point asks for the curve, so that media points find their samples.
     for (int i = 0; i < keyPoints.size(); ++i)
         path->addKeyPoint(keyPoints[i], i + 1 == keyPoints.size());
+    return numbers;
 }
 
 void ProjectLoader::readSegments()
@@ -242,16 +268,15 @@ void ProjectLoader::readMediaPoints()
         return;
     int32_t count = 0;
     PointRecordReader(m_store, QStringLiteral("mediapoints")).read(QStringLiteral("elements"), count);
+    const std::vector<int32_t> numbers = m_store.numberedSections(QStringLiteral("mediapoint"), count);
+    if (numbers.size() != size_t(std::max(count, 0)))
+        logTrace(3, QStringLiteral("ProjectLoader -> %d of %d media point sections present"), int(numbers.size()), count);
+    // Before the points are added, which name their samples by position.
+    renumberReferences(*path, &CurvePoint::correspondingMediaPoint, numbers);
     const bool useIndex = path->pathType == PathType::GPX;
-    for (int32_t i = 0; i < count; ++i) {
-        const QString section = QStringLiteral("mediapoint%1").arg(i);
-        // Every saved media point has "x"; a count beyond the stored sections is damage.
-        if (!PointRecordReader(m_store, section).has(QStringLiteral("x"))) {
-            logTrace(3, QStringLiteral("ProjectLoader -> section %s missing, %d of %d media points read"), section, i, count);
-            break;
-        }
+    for (const int32_t i : numbers) {
         MediaPoint point;
-        point.Load(m_store, section);
+        point.Load(m_store, QStringLiteral("mediapoint%1").arg(i));
         uint32_t keyPointId = 0;
         for (const KeyPoint &k : path->keyPoints) {
             if (k.x == point.longitude && k.y == point.latitude) {

@@ -2,6 +2,9 @@
 
 #include <QString>
 
+#include <cstdint>
+#include <vector>
+
 class PainterPathRenderer_Controller;
 class ProjectController;
 
@@ -26,7 +29,8 @@ private:
     double readRouteFactor();
     void readLook();
     void readGeometry();
-    void readKeyPoints();
+    // The section numbers of the key points read.
+    std::vector<int32_t> readKeyPoints();
     void readSegments();
     void readMediaPoints();
     void convertOldRouteDuration(double routeFactor);

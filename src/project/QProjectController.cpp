@@ -1,6 +1,7 @@
 #include "project/QProjectController.h"
 
 #include "app/Trace.h"
+#include "project/SettingsValue.h"
 
 #include <QDateTime>
 #include <QFile>
@@ -36,15 +37,6 @@ QString address(const QString &section, const QString &key)
     return QStringLiteral("%1/%2").arg(section, key);
 }
 
-// A value of the store as the text the container hands out.
-QString storedText(const QVariant &value)
-{
-    // A hand-edited line with unquoted commas reads as a list; keep its text.
-    if (value.type() == QVariant::StringList)
-        return value.toStringList().join(QLatin1Char(','));
-    return value.toString();
-}
-
 // Every value of an existing file, as the container reads it, into `content`.
 // False when the file can't be read whole: adding to it would lose the rest.
 bool copyStoredValues(const QString &fileName, IniFileWriter &content)
@@ -55,7 +47,7 @@ bool copyStoredValues(const QString &fileName, IniFileWriter &content)
     if (stored.status() != QSettings::NoError)
         return false;
     for (const QString &key : stored.allKeys())
-        content.setValue(QString(), key, storedText(stored.value(key)));
+        content.setValue(QString(), key, settingsValueText(stored.value(key)));
     return true;
 }
 
@@ -133,6 +125,7 @@ bool QProjectController::openProjectFile(QString fileName, bool forLoad)
     }
     m_writeFailed = false;
     m_writeError.clear();
+    m_numbered.reset();
     if (!forLoad)
         return openForAdding(fileName);
     if (!QFile::exists(fileName)) {
@@ -187,16 +180,7 @@ QString QProjectController::readProperty(QString section, QString key, QString d
 {
     if (m_plainFile) {
         QString value;
-        switch (m_plainFile->value(section, key, value)) {
-        case IniFileReader::Lookup::Found:
-            return value;
-        case IniFileReader::Lookup::Missing:
-            return defaultValue;
-        case IniFileReader::Lookup::NeedsStore:
-            break;
-        }
-        if (!m_reader)
-            m_reader = std::make_unique<QSettings>(m_fileName, QSettings::IniFormat);
+        return m_plainFile->value(section, key, value) ? value : defaultValue;
     }
     if (!m_reader) {
         logTrace(3, QStringLiteral("QProjectController::writeProperty: file %s doesn't exist"), m_fileName);
@@ -208,7 +192,7 @@ QString QProjectController::readProperty(QString section, QString key, QString d
 QString QProjectController::storeValue(const QString &address, const QString &defaultValue)
 {
     const QVariant value = m_reader->value(address);
-    return value.isValid() ? storedText(value) : defaultValue;
+    return value.isValid() ? settingsValueText(value) : defaultValue;
 }
 
 bool QProjectController::closeProjectFile()
@@ -223,9 +207,24 @@ bool QProjectController::closeProjectFile()
         m_target.reset();
     }
     m_reader.reset();
+    m_numbered.reset();
     if (m_plainFile)
         m_lastRead.reader = std::move(m_plainFile);
     return true;
+}
+
+std::vector<int32_t> QProjectController::numberedSections(QString stem, int32_t count)
+{
+    if (!m_numbered) {
+        m_numbered = std::make_unique<NumberedSections>();
+        if (m_plainFile) {
+            m_plainFile->listSections(*m_numbered);
+        } else if (m_reader) {
+            for (const QString &group : m_reader->childGroups())
+                m_numbered->add(group);
+        }
+    }
+    return m_numbered->below(stem, count);
 }
 
 void QProjectController::forgetReadFile()

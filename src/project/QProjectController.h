@@ -12,7 +12,8 @@ class QSettings;
 // The ini container used by projects and altitude presets: one writer or one
 // reader at a time, in the format of QSettings::IniFormat. Files are written by our
 // own code, which gives the bytes of the store at a fraction of the cost, and a
-// plain file is read by it too; anything unusual is read through QSettings itself.
+// plain file (LF or CRLF lines) is read by it too; anything unusual is read through
+// QSettings itself.
 //
 // Nothing reaches the disk before the close: the whole content then goes into a
 // temporary file that replaces the file in one rename, so a write that fails on the
@@ -29,6 +30,7 @@ public:
     bool writeProperty(QString section, QString key, QString value) override;
     QString readProperty(QString section, QString key, QString defaultValue) override;
     bool closeProjectFile() override;
+    std::vector<int32_t> numberedSections(QString stem, int32_t count) override;
 
     bool isIdle() const { return !isWriting() && !isReading(); }
     bool isWriting() const { return m_content != nullptr; }
@@ -55,6 +57,7 @@ private:
     std::unique_ptr<IniFileWriter> m_content;
     std::unique_ptr<AtomicFileWriter> m_target;
     std::unique_ptr<IniFileReader> m_plainFile;
+    std::unique_ptr<NumberedSections> m_numbered; // of the file being read, made when first asked
     struct ReadFile
     {
         QString name;

@@ -1,9 +1,11 @@
 #include "path/CurveGenerator.h"
 #include "path/GeoDistance.h"
+#include "path/NearestSample.h"
 #include "path/Path.h"
 #include "path/PathMode.h"
 
 #include <QGeoCoordinate>
+#include <QRandomGenerator>
 #include <QTest>
 
 #include <algorithm>
@@ -98,6 +100,12 @@ private slots:
             Path same = makePath(mode, {{7, 8}, {7, 8}});
             QCOMPARE(same.curvePoints.size(), size_t(1));
             QCOMPARE(same.curvePoints.front().correspondingKeyPoint, same.keyPoints.front().id);
+            // A doubled key point beside a leg leaves that leg's samples numbers.
+            for (const Path &doubled : {makePath(mode, {{7, 8}, {7, 8}, {9, 9}}), makePath(mode, {{5, 5}, {7, 8}, {7, 8}})}) {
+                QVERIFY(doubled.curvePoints.size() > 200);
+                for (const CurvePoint &c : doubled.curvePoints)
+                    QVERIFY(std::isfinite(c.x) && std::isfinite(c.y));
+            }
         }
 
         Path airplane = makePath(CurveMode::Arc, {{0, 0}, {10, 10}, {20, 0}});
@@ -369,6 +377,64 @@ private slots:
         for (const auto &c : cases)
             QCOMPARE(geoDistance(c[0], c[1], c[2], c[3]), QGeoCoordinate(c[0], c[1]).distanceTo(QGeoCoordinate(c[2], c[3])));
         QCOMPARE(geoDistance(95, 0, 0, 0), 0.0);
+    }
+
+    void nearestSampleMatchesAFullScan()
+    {
+        // Random routes of wandering runs, with jumps over the antimeridian and to
+        // the poles, repeated places (ties) and now and then a sample that is no
+        // valid coordinate; places near samples, on them, far off and invalid.
+        QRandomGenerator random(31337);
+        auto uniform = [&](double low, double high) { return low + (high - low) * random.generateDouble(); };
+        int found = 0;
+        for (int route = 0; route < 40; ++route) {
+            std::vector<CurvePoint> samples;
+            double lon = uniform(-180, 180), lat = uniform(-90, 90);
+            const int count = int(random.bounded(1, 3000));
+            const double step = std::pow(10.0, uniform(-5, 0));
+            for (int i = 0; i < count; ++i) {
+                switch (random.bounded(200)) {
+                case 0: lon = -lon; break;
+                case 1: lat = lat < 0 ? -90 : 90; break;
+                case 2: lon = lon < 0 ? -180 : 180; break;
+                default: break;
+                }
+                lon = std::clamp(lon + uniform(-step, step), -180.0, 180.0);
+                lat = std::clamp(lat + uniform(-step, step), -90.0, 90.0);
+                if (random.bounded(500) == 0)
+                    samples.emplace_back(random.bounded(2) ? std::nan("") : 200.0, lat, 0.0);
+                else if (i > 0 && random.bounded(20) == 0)
+                    samples.push_back(samples[size_t(random.bounded(i))]);
+                else
+                    samples.emplace_back(lon, lat, 0.0);
+            }
+            const NearestSample nearest(samples);
+            for (int query = 0; query < 200; ++query) {
+                const CurvePoint &near = samples[size_t(random.bounded(count))];
+                double qlat = near.y, qlon = near.x;
+                switch (query % 4) {
+                case 0: break;
+                case 1: qlat += uniform(-1, 1) * step * 10; qlon += uniform(-1, 1) * step * 10; break;
+                case 2: qlat = uniform(-90, 90); qlon = uniform(-180, 180); break;
+                default: qlat = query % 8 == 3 ? 91.0 : uniform(-90, 90); break;
+                }
+                const double limit = query % 5 == 0 ? GeoDistanceFrom::metresToTerm(uniform(1, 1e5))
+                                                    : GeoDistanceFrom::metresToTerm(1e7);
+                const GeoDistanceFrom from(qlat, qlon);
+                int expected = -1;
+                double best = limit;
+                for (size_t i = 0; i < samples.size(); ++i) {
+                    const double d = from.term(samples[i].y, samples[i].x);
+                    if (d < best) {
+                        best = d;
+                        expected = int(i);
+                    }
+                }
+                QCOMPARE(nearest.find(qlat, qlon, limit), expected);
+                found += expected >= 0;
+            }
+        }
+        QVERIFY(found > 4000);
     }
 
     void correspondingIdsFromIndices()

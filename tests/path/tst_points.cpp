@@ -2,11 +2,14 @@
 #include "path/ContentPath.h"
 #include "path/CurvePoint.h"
 #include "path/DefaultTitle.h"
+#include "path/IdCounter.h"
 #include "path/KeyPoints.h"
 #include "path/MediaPoint.h"
+#include "project/NumberedSections.h"
 #include "project/QProjectController.h"
 #include "project/ValueParsers.h"
 
+#include <QDir>
 #include <QFile>
 #include <QImage>
 #include <QMap>
@@ -42,6 +45,13 @@ public:
     QString readProperty(QString section, QString key, QString defaultValue) override
     {
         return values.value(section + QLatin1Char('/') + key, defaultValue);
+    }
+    std::vector<int32_t> numberedSections(QString stem, int32_t count) override
+    {
+        NumberedSections sections;
+        for (auto it = values.cbegin(); it != values.cend(); ++it)
+            sections.add(it.key().section(QLatin1Char('/'), 0, 0));
+        return sections.below(stem, count);
     }
 
     void set(const QString &section, const QString &key, const QString &value)
@@ -144,6 +154,12 @@ private slots:
         QCOMPARE(list.at(1).id, a.id);
         QCOMPARE(list.at(2).id, d.id);
         QVERIFY(list.at(0).id > d.id);
+
+        // A counter that runs over starts at 1 again: 0 means no point.
+        IdCounter nearTheEnd(0xFFFFFFFEu);
+        QCOMPARE(nearTheEnd.draw(), 0xFFFFFFFEu);
+        QCOMPARE(nearTheEnd.draw(), 0xFFFFFFFFu);
+        QCOMPARE(nearTheEnd.draw(), 1u);
     }
 
     void constructorsAndSetters()
@@ -388,7 +404,7 @@ private slots:
         QVERIFY(loadKeyPoints(store, 2, third));
         QCOMPARE(defaultKeyPointTitleCounter(), 4u);
 
-        // A count larger than the sections present stops at the gap.
+        // A count larger than the sections present loads those there are.
         store.set(QStringLiteral("keypoints"), QStringLiteral("elements"), QStringLiteral("1000000"));
         QVector<KeyPoint> damaged;
         QVERIFY(loadKeyPoints(store, 2, damaged));
@@ -459,6 +475,12 @@ private slots:
         QCOMPARE(rebaseContentPath(QStringLiteral("file:///home/u/photos/a.png")),
                  QStringLiteral("file:///home/u/photos/a.png"));
         QCOMPARE(rebaseContentPath(QStringLiteral("/home/u/photos/a.png")), QStringLiteral("/home/u/photos/a.png"));
+        // A file that opens where it was stored is left there.
+        QVERIFY(QDir().mkpath(path(QStringLiteral("imgsrc"))));
+        const QString own = path(QStringLiteral("imgsrc/own.png"));
+        writeJpeg(own, -1);
+        QCOMPARE(rebaseContentPath(own), own);
+        QCOMPARE(rebaseContentPath(QStringLiteral("file://") + own), QStringLiteral("file://") + own);
 
         // Through a key point load: both sources, a present value only.
         MemoryStore store;

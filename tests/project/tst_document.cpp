@@ -3,6 +3,7 @@
 #include "project/DocumentFile.h"
 #include "project/PainterPathRenderer_Controller.h"
 #include "project/ValueParsers.h"
+#include "app/ProgramFolder.h"
 
 #include <QDir>
 #include <QFile>
@@ -11,6 +12,7 @@
 #include <QTemporaryDir>
 #include <QTest>
 
+#include <algorithm>
 #include <csignal>
 #include <functional>
 #include <grp.h>
@@ -487,6 +489,112 @@ private slots:
         QCOMPARE(q.mediaPoints.size(), size_t(2));
     }
 
+    void listsKeepTheEntriesAfterAGap_data()
+    {
+        QTest::addColumn<QString>("dropped");
+        QTest::addColumn<QString>("list");
+        QTest::addColumn<QStringList>("expected");
+        QTest::newRow("key point") << "keypoint1" << "keyPoints" << QStringList{"k0", "k2"};
+        QTest::newRow("media point") << "mediapoint1" << "mediaPoints" << QStringList{"m0", "m2"};
+        QTest::newRow("photo") << "photopool_item1" << "photos" << QStringList{"/gone/p0.jpg", "/gone/p2.jpg"};
+        QTest::newRow("curve point") << "curvepoint5" << "curve" << QStringList{"1", "2", "3", "4", "5", "7"};
+        QTest::newRow("segment sample") << "pathsegment0curvepoint1" << "segment0" << QStringList{"1", "3", "4"};
+    }
+
+    // A track of samples x = 1..7 with key points on 1, 4 and 7 and photos on 2, 3 and 5.
+    void listsKeepTheEntriesAfterAGap()
+    {
+        QFETCH(QString, dropped);
+        QFETCH(QString, list);
+        QFETCH(QStringList, expected);
+        const uint32_t none = noPointIndex;
+        const int keyAt[] = {0, 3, 6}, mediaAt[] = {1, 2, 4};
+        auto sample = [&](const QString &section, int i) {
+            const int key = int(std::find(std::begin(keyAt), std::end(keyAt), i) - std::begin(keyAt));
+            const int media = int(std::find(std::begin(mediaAt), std::end(mediaAt), i) - std::begin(mediaAt));
+            return QStringLiteral("[%1]\nx=%2\ny=1\ncorrespondingKeyPoint=%3\ncorrespondingMediaPoint=%4\n")
+                .arg(section).arg(i + 1).arg(key < 3 ? uint32_t(key) : none).arg(media < 3 ? uint32_t(media) : none);
+        };
+        QString text = projectHeader() + QStringLiteral("[animator]\ncurvemode=1\npathtype=2\n[curvepoints]\nelements=7\n");
+        for (int i = 0; i < 7; ++i)
+            text += sample(QStringLiteral("curvepoint%1").arg(i), i);
+        text += QStringLiteral("[keypoints]\nelements=3\n[pathSegments]\nelements=3\n"
+                               "[mediapoints]\nelements=3\n[photopool]\nsize=3\n");
+        for (int i = 0; i < 3; ++i) {
+            text += QStringLiteral("[keypoint%1]\nx=%2\ny=1\nkppTitle=k%1\n").arg(i).arg(keyAt[i] + 1);
+            text += QStringLiteral("[mediapoint%1]\nx=%2\ny=1\nlongitude=%2\nlatitude=1\nmppTitle=m%1\n").arg(i).arg(mediaAt[i] + 1);
+            text += QStringLiteral("[photopool_item%1]\npath=/gone/p%1.jpg\n").arg(i);
+            const int first = keyAt[i], last = i < 2 ? keyAt[i + 1] : 6;
+            text += QStringLiteral("[pathsegment%1]\ncurvepoints=%2\n").arg(i).arg(last - first + 1);
+            for (int j = first; j <= last; ++j)
+                text += sample(QStringLiteral("pathsegment%1curvepoint%2").arg(i).arg(j - first), j);
+        }
+        const int at = text.indexOf(QLatin1Char('[') + dropped + QLatin1Char(']'));
+        QVERIFY(at > 0);
+        text.remove(at, text.indexOf(QLatin1Char('['), at + 1) - at);
+        const QString file = path(QStringLiteral("gap.zkgeo"));
+        writeText(file, text.toUtf8());
+
+        PainterPathRenderer_Controller doc;
+        QCOMPARE(int(openDocumentFile(doc, file).status), int(DocumentOpenResult::Status::Project));
+        const Path &p = doc.pathManager().activeChecked();
+        QStringList found;
+        if (list == QLatin1String("keyPoints")) {
+            for (const KeyPoint &k : p.keyPoints)
+                found << k.properties.title;
+        } else if (list == QLatin1String("mediaPoints")) {
+            for (const MediaPoint &m : p.mediaPoints)
+                found << m.properties.title;
+        } else if (list == QLatin1String("photos")) {
+            for (const PoolPhoto &photo : doc.photoPool().photos)
+                found << photo.path;
+        } else {
+            for (const CurvePoint &c : list == QLatin1String("curve") ? p.curvePoints : p.pathSegments.at(0).curvePoints)
+                found << QString::number(c.x);
+        }
+        QCOMPARE(found, expected);
+
+        // The samples still name the points that stand on them.
+        for (const CurvePoint &c : p.curvePoints) {
+            if (const BasePoint *k = p.findPoint(c.correspondingKeyPoint))
+                QCOMPARE(k->x, c.x);
+            if (const BasePoint *m = p.findPoint(c.correspondingMediaPoint))
+                QCOMPARE(m->x, c.x);
+        }
+        QCOMPARE(p.curvePoints.back().correspondingKeyPoint, p.keyPoints.back().id);
+        QCOMPARE(p.curvePoints[4].correspondingMediaPoint, p.mediaPoints.back().id);
+    }
+
+    void avatarsMoveToThisInstallation_data()
+    {
+        QTest::addColumn<QString>("sections");
+        const QString keyPoints = QStringLiteral(
+            "[keypoints]\nelements=2\n[keypoint0]\nx=1\ny=2\n[keypoint1]\nx=3\ny=4\n");
+        const QString avatar = QStringLiteral("pilot_source=C:/Program Files/Old/imgsrc/pilots/car.png\n"
+                                              "pilot_thumb=file:///D:/Old/imgsrc/pilots/car_t.png\n");
+        QTest::newRow("segments") << keyPoints + QStringLiteral("[pathSegments]\nelements=2\n[pathsegment0]\n") + avatar +
+                                         QStringLiteral("[pathsegment1]\n") + avatar;
+        QTest::newRow("one avatar of version 1") << keyPoints + QStringLiteral("[pilot]\n") + avatar;
+    }
+
+    void avatarsMoveToThisInstallation()
+    {
+        QFETCH(QString, sections);
+        const QString file = path(QStringLiteral("moved.zkgeo"));
+        writeText(file, (projectHeader() + QStringLiteral("[animator]\ncurvemode=1\npathtype=1\n") + sections).toUtf8());
+        setProgramFolder(QStringLiteral("/opt/tourlet"));
+        PainterPathRenderer_Controller doc;
+        const DocumentOpenResult result = openDocumentFile(doc, file);
+        setProgramFolder(QString());
+        QCOMPARE(int(result.status), int(DocumentOpenResult::Status::Project));
+        const Path &p = doc.pathManager().activeChecked();
+        QCOMPARE(p.pathSegments.size(), size_t(2));
+        for (const PathSegment &s : p.pathSegments) {
+            QCOMPARE(s.pilot.source, QStringLiteral("/opt/tourlet/imgsrc/pilots/car.png"));
+            QCOMPARE(s.pilot.thumb, QStringLiteral("file:///opt/tourlet/imgsrc/pilots/car_t.png"));
+        }
+    }
+
     void themeInTheSameWritingGivesTheSameBytes()
     {
         QImage image(8, 8, QImage::Format_RGB32);
@@ -548,6 +656,26 @@ private slots:
         QCOMPARE(readBytes(b), readBytes(a));
     }
 
+    // Projects found by fuzzing: each opens, and what it saves opens again.
+    void fuzzFindsOpenAfterSaving_data()
+    {
+        QTest::addColumn<QString>("file");
+        for (const QFileInfo &found : QDir(QStringLiteral(TOURLET_TEST_DATA)).entryInfoList({QStringLiteral("*.zkgeo")}))
+            QTest::newRow(qPrintable(found.fileName())) << found.filePath();
+    }
+
+    void fuzzFindsOpenAfterSaving()
+    {
+        QFETCH(QString, file);
+        PainterPathRenderer_Controller doc;
+        QCOMPARE(int(openDocumentFile(doc, file).status), int(DocumentOpenResult::Status::Project));
+        const QString saved = path(QStringLiteral("fuzz find.zkgeo"));
+        QVERIFY(saveDocumentFile(doc, saved));
+        PainterPathRenderer_Controller again;
+        QCOMPARE(int(openDocumentFile(again, saved).status), int(DocumentOpenResult::Status::Project));
+        QCOMPARE(again.pathManager().activeChecked().curvePoints.size(), doc.pathManager().activeChecked().curvePoints.size());
+    }
+
     void damagedAndForeignFiles()
     {
         PainterPathRenderer_Controller doc;
@@ -562,6 +690,14 @@ private slots:
         QVERIFY(doc.fields().projectTitle.isEmpty()); // back to a new project
         QVERIFY(doc.pathManager().activeChecked().keyPoints.empty());
         QVERIFY(doc.projectController().isIdle());
+
+        // A coordinate that is no finite number is damage too, wherever a point stands.
+        for (const char *point : {"[keypoints]\nelements=1\n[keypoint0]\nx=nan\n",
+                                  "[keypoints]\nelements=1\n[keypoint0]\nx=1\nlatitude=-inf\n",
+                                  "[centerPosition]\naltitude=infinity\n"}) {
+            writeText(damaged, projectHeader().toUtf8() + point);
+            QCOMPARE(int(openDocumentFile(doc, damaged).status), int(DocumentOpenResult::Status::DamagedProject));
+        }
 
         writeText(damaged, (projectHeader() + QStringLiteral("[animator]\nprojectWidth=99999999999\n")).toUtf8());
         QCOMPARE(int(openDocumentFile(doc, damaged).status), int(DocumentOpenResult::Status::DamagedProject));
