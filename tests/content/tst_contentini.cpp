@@ -16,9 +16,14 @@ class TestContentIni : public QObject
 private:
     QTemporaryDir m_dir;
     QString path(const QString &name) const { return m_dir.filePath(name); }
-    static QString value(const QString &file, const QString &section, const QString &key)
+    // Read by the content format, or by the platform one.
+    static QString value(const QString &file, const QString &section, const QString &key, bool contentIni = true)
     {
-        return readIniValue(file, section, key, true, QStringLiteral("<absent>"));
+        return readIniValue(file, section, key, contentIni, QStringLiteral("<absent>"));
+    }
+    static QStringList list(const QString &file, const QString &section, bool contentIni = true)
+    {
+        return readIniList(file, section, QStringLiteral("paths"), QStringLiteral(","), contentIni);
     }
 
 private slots:
@@ -28,34 +33,28 @@ private slots:
         QVERIFY(writeFile(file,
                           "top=level\n"
                           "[Big Name]\n"
-                          "a=1\n"
                           "[ Big  Name ]\n"
                           "b=2\n"
                           "[ Spaced Name ]\n"
                           "key = a = b\n"
                           "a b = c\n"
-                          "= c\n"
                           "empty =\n"
                           "Case=MiXed Value\n"
                           "dup=first\n"
                           "dup=second\n"
                           "  folder\\sub =  x  \n"
                           "link=a=b\n"
-                          "; note = not a key\n"
                           "[Tab\tbed]\n"
                           "t=after tab header\n"
                           "[a]]\n"
                           "z=bracket\n"));
         QCOMPARE(value(file, QString(), QStringLiteral("top")), QStringLiteral("level"));
-        QCOMPARE(value(file, QStringLiteral("Big Name"), QStringLiteral("a")), QStringLiteral("1"));
         // Two blanks make no section: the key stays in the one before.
         QCOMPARE(value(file, QStringLiteral("Big Name"), QStringLiteral("b")), QStringLiteral("2"));
         QCOMPARE(value(file, QStringLiteral("Big  Name"), QStringLiteral("b")), QStringLiteral("<absent>"));
         const QString spaced = QStringLiteral("Spaced Name");
         QCOMPARE(value(file, spaced, QStringLiteral("key")), QStringLiteral("a = b"));
         QCOMPARE(value(file, spaced, QStringLiteral("a b")), QStringLiteral("<absent>"));
-        QCOMPARE(value(file, spaced, QStringLiteral("a")), QStringLiteral("<absent>"));
-        QCOMPARE(value(file, spaced, QString()), QStringLiteral("<absent>"));
         QCOMPARE(value(file, spaced, QStringLiteral("empty")), QStringLiteral("<absent>"));
         // Key and section case don't matter, value case stays.
         QCOMPARE(value(file, QStringLiteral("SPACED name"), QStringLiteral("cASE")), QStringLiteral("MiXed Value"));
@@ -63,39 +62,26 @@ private slots:
         QCOMPARE(value(file, spaced, QStringLiteral("folder/sub")), QStringLiteral("x"));
         // The key takes the last "=" of a line without blanks around the first one.
         QCOMPARE(value(file, spaced, QStringLiteral("link=a")), QStringLiteral("b"));
-        QCOMPARE(value(file, spaced, QStringLiteral("note")), QStringLiteral("<absent>"));
         // A tab inside the brackets is no section either.
         QCOMPARE(value(file, spaced, QStringLiteral("t")), QStringLiteral("after tab header"));
         QCOMPARE(value(file, QStringLiteral("a]"), QStringLiteral("z")), QStringLiteral("bracket"));
-        QCOMPARE(value(path(QStringLiteral("missing.ini")), spaced, QStringLiteral("key")), QStringLiteral("<absent>"));
     }
 
     void valuesStayAsWritten()
     {
         const QString file = path(QStringLiteral("values.ini"));
         QVERIFY(writeFile(file, "[main]\n"
-                                "list=a, b,c\n"
                                 "mixed=one;two, \"three\" 'four' C:\\dir\\file.png\n"
                                 "quoted=\"quoted\"\n"
                                 "hash=#FF0000 ; trailing\n"));
-        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("list")), QStringLiteral("a, b,c"));
-        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("mixed")),
-                 QStringLiteral("one;two, \"three\" 'four' C:\\dir\\file.png"));
-        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("quoted")), QStringLiteral("\"quoted\""));
-        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("hash")), QStringLiteral("#FF0000 ; trailing"));
-        // The platform format reads the same lines its own way.
-        QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("quoted"), false), QStringLiteral("quoted"));
-        QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("hash"), false), QStringLiteral("#FF0000"));
-        QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("nokey"), false, QStringLiteral("d")),
-                 QStringLiteral("d"));
-        QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("list"), QStringLiteral(","), false),
-                 QStringList({QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("c")}));
-        QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("list"), QStringLiteral(","), true),
-                 QStringList({QStringLiteral("a"), QStringLiteral("b"), QStringLiteral("c")}));
-        // QSettings shares one parse per path between formats; the content reads must not see it.
-        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("quoted")), QStringLiteral("\"quoted\""));
-        QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("mixed"), QStringLiteral(";"), true),
-                 QStringList({QStringLiteral("one"), QStringLiteral("two, \"three\" 'four' C:\\dir\\file.png")}));
+        const QString main = QStringLiteral("main");
+        QCOMPARE(value(file, main, QStringLiteral("mixed")), QStringLiteral("one;two, \"three\" 'four' C:\\dir\\file.png"));
+        QCOMPARE(value(file, main, QStringLiteral("hash")), QStringLiteral("#FF0000 ; trailing"));
+        // The platform format reads the same lines its own way; QSettings shares one
+        // parse per path between formats, and the content reads must not see it.
+        QCOMPARE(value(file, main, QStringLiteral("quoted"), false), QStringLiteral("quoted"));
+        QCOMPARE(value(file, main, QStringLiteral("hash"), false), QStringLiteral("#FF0000"));
+        QCOMPARE(value(file, main, QStringLiteral("quoted")), QStringLiteral("\"quoted\""));
     }
 
     void encodingsAndLineEnds()
@@ -124,7 +110,7 @@ private slots:
         const QString windows = path(QStringLiteral("cp1252.ini"));
         QVERIFY(writeFile(windows, "[main]\nname=F\xE4hre \x80\n"));
         QCOMPARE(value(windows, QStringLiteral("main"), QStringLiteral("name")), QStringLiteral("Fähre €"));
-        QCOMPARE(readIniValue(windows, QStringLiteral("main"), QStringLiteral("name"), false), QStringLiteral("Fähre €"));
+        QCOMPARE(value(windows, QStringLiteral("main"), QStringLiteral("name"), false), QStringLiteral("Fähre €"));
     }
 
     void damagedFilesGiveDefaults()
@@ -133,32 +119,27 @@ private slots:
         for (int i = 0; i < 5000; ++i)
             garbage += char((i * 7919) % 256);
         const QList<QByteArray> bodies = {garbage, QByteArray(), QByteArray("["), QByteArray("=\n=\n[]\n[ ]"),
-                                          QByteArray(200000, 'x') + "=" + QByteArray(200000, ' ') + "y",
                                           QByteArray("\xFF\xFE\x00"), QByteArray("\xEF\xBB\xBF")};
         for (int i = 0; i < bodies.size(); ++i) {
             const QString file = path(QStringLiteral("damaged%1.ini").arg(i));
             QVERIFY(writeFile(file, bodies.at(i)));
             QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("type")), QStringLiteral("<absent>"));
-            QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("type"), false, QStringLiteral("d")),
-                     QStringLiteral("d"));
+            QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("type"), false), QStringLiteral("<absent>"));
         }
-        // Things that are no small regular file are not read at all.
+        // Things that are no small regular file are not read at all, cached or not.
         const QString folder = path(QStringLiteral("folder.ini"));
         QVERIFY(QDir().mkpath(folder));
         const QString fifo = path(QStringLiteral("pipe.ini"));
         QCOMPARE(::mkfifo(QFile::encodeName(fifo).constData(), 0600), 0);
         const QString huge = path(QStringLiteral("huge.ini"));
         QVERIFY(writeFile(huge, "[main]\ntype=png\n" + QByteArray(17 * 1024 * 1024, '\n')));
+        IniReadCache cache;
         for (const QString &file : {folder, fifo, huge}) {
-            for (bool contentIni : {true, false}) {
-                QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("type"), contentIni, QStringLiteral("d")),
-                         QStringLiteral("d"));
-                IniReadCache cache;
-                QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("type"), contentIni, QStringLiteral("d")),
-                         QStringLiteral("d"));
-            }
+            for (bool contentIni : {true, false})
+                QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("type"), contentIni), QStringLiteral("<absent>"));
         }
 
+        // A long line is read, not cut.
         QSettings::SettingsMap map;
         ContentIni::parse(QByteArray(200000, 'x') + "=" + QByteArray(200000, ' ') + "y", map);
         QCOMPARE(map.size(), 1);
@@ -167,7 +148,6 @@ private slots:
 
     void registeredFormatIsReadOnly()
     {
-        QCOMPARE(ContentIni::format(), ContentIni::format());
         const QString file = path(QStringLiteral("splash.ini"));
         const QByteArray original = "[Text]\nTitle=Hello, world; \"quoted\"\n";
         QVERIFY(writeFile(file, original));
@@ -175,7 +155,6 @@ private slots:
             QSettings settings(file, ContentIni::format());
             // Keys are stored lower-cased; QSettings itself compares them as given.
             QCOMPARE(settings.value(QStringLiteral("text/title")).toString(), QStringLiteral("Hello, world; \"quoted\""));
-            QCOMPARE(settings.childGroups(), QStringList{QStringLiteral("text")});
             settings.setValue(QStringLiteral("Text/Title"), QStringLiteral("changed"));
             settings.sync();
             QCOMPARE(settings.status(), QSettings::AccessError);
@@ -188,93 +167,55 @@ private slots:
     void listsArePrependedAndRemoved()
     {
         const QString file = path(QStringLiteral("lists/tourletContent.ini"));
-        QDir().mkpath(QFileInfo(file).path());
-        QVERIFY(prependIniListValue(file, QStringLiteral("/data/userAvatars/u3d_car"), QStringLiteral("avatars"),
-                                    QStringLiteral("paths")));
-        QVERIFY(prependIniListValue(file, QStringLiteral("/data/userAvatars/u3d_Zürich(1)"), QStringLiteral("avatars"),
-                                    QStringLiteral("paths")));
-        QVERIFY(prependIniListValue(file, QStringLiteral("/data/userAvatars/u3d_car"), QStringLiteral("avatars"),
-                                    QStringLiteral("paths")));
-        QVERIFY(prependIniListValue(file, QStringLiteral("/maps/extra"), QStringLiteral("maps"), QStringLiteral("paths")));
-        const QStringList expected = {QStringLiteral("/data/userAvatars/u3d_car"),
-                                      QStringLiteral("/data/userAvatars/u3d_Zürich(1)"),
-                                      QStringLiteral("/data/userAvatars/u3d_car")};
-        // Written by the platform format, read back by the content format.
-        QCOMPARE(readIniList(file, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), true), expected);
-        QCOMPARE(readIniList(file, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), false), expected);
+        const QString avatars = QStringLiteral("avatars"), paths = QStringLiteral("paths");
+        const QString car = QStringLiteral("/data/userAvatars/u3d_car");
+        const QString zurich = QStringLiteral("/data/userAvatars/u3d_Zürich(1)");
+        QVERIFY(prependIniListValue(file, car, avatars, paths));
+        QVERIFY(prependIniListValue(file, zurich, avatars, paths));
+        QVERIFY(prependIniListValue(file, car, avatars, paths));
+        QVERIFY(prependIniListValue(file, QStringLiteral("/maps/extra"), QStringLiteral("maps"), paths));
+        // Written by the platform format, read back by both.
+        QCOMPARE(list(file, avatars), QStringList({car, zurich, car}));
+        QCOMPARE(list(file, avatars, false), QStringList({car, zurich, car}));
 
-        QVERIFY(removeIniListValue(file, QStringLiteral("u3d_car"), QStringLiteral("avatars"), QStringLiteral("paths")));
-        QCOMPARE(readIniList(file, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), true),
-                 QStringList{QStringLiteral("/data/userAvatars/u3d_Zürich(1)")});
-        QVERIFY(removeIniListValue(file, QStringLiteral("u3d_Zürich(1)"), QStringLiteral("avatars"), QStringLiteral("paths")));
-        QVERIFY(readIniList(file, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), true).isEmpty());
-        QCOMPARE(readIniList(file, QStringLiteral("maps"), QStringLiteral("paths"), QStringLiteral(","), true),
-                 QStringList{QStringLiteral("/maps/extra")});
+        // Removed by the last path component, every time it is there.
+        QVERIFY(removeIniListValue(file, QStringLiteral("u3d_car"), avatars, paths));
+        QCOMPARE(list(file, avatars), QStringList{zurich});
+        QVERIFY(removeIniListValue(file, QStringLiteral("u3d_Zürich(1)"), avatars, paths));
+        QVERIFY(list(file, avatars).isEmpty());
+        QCOMPARE(list(file, QStringLiteral("maps")), QStringList{QStringLiteral("/maps/extra")});
         // An empty list is written as no key, so the next prepend starts clean.
-        QVERIFY(prependIniListValue(file, QStringLiteral("/again"), QStringLiteral("avatars"), QStringLiteral("paths")));
-        QCOMPARE(readIniList(file, QStringLiteral("avatars"), QStringLiteral("paths"), QStringLiteral(","), true),
-                 QStringList{QStringLiteral("/again")});
-        QVERIFY(!removeIniListValue(path(QStringLiteral("lists/none.ini")), QStringLiteral("x"), QStringLiteral("a"),
-                                    QStringLiteral("b")));
+        QVERIFY(prependIniListValue(file, QStringLiteral("/again"), avatars, paths));
+        QCOMPARE(list(file, avatars), QStringList{QStringLiteral("/again")});
+
+        QVERIFY(!removeIniListValue(path(QStringLiteral("lists/none.ini")), QStringLiteral("x"), avatars, paths));
         // Below a plain file no folder can be made.
-        QVERIFY(!prependIniListValue(file + QStringLiteral("/x.ini"), QStringLiteral("v"), QStringLiteral("a"),
-                                     QStringLiteral("b")));
+        QVERIFY(!prependIniListValue(file + QStringLiteral("/x.ini"), QStringLiteral("v"), avatars, paths));
     }
 
-    void listValuesFollowTheList()
-    {
-        const QString file = path(QStringLiteral("listvalues.ini"));
-        QVERIFY(writeFile(file, "[main]\norder=b, a ,missing\nA=first\nb=second\n[names]\na=named a\n"));
-        QCOMPARE(readIniListValues(file, QStringLiteral("main"), QStringLiteral("order")),
-                 QStringList({QStringLiteral("second"), QStringLiteral("first"), QString()}));
-        QCOMPARE(readIniListValues(file, QStringLiteral("main"), QStringLiteral("order"), QStringLiteral("names")),
-                 QStringList({QString(), QStringLiteral("named a"), QString()}));
-    }
-
-    void folderHelpers()
+    void informationFilesSortByStem()
     {
         const QString root = path(QStringLiteral("folders/"));
         for (const char *name : {"informations/b.ini", "informations/A.ini", "informations/c.INI", "informations/x.txt",
-                                 "informations/z.v2.ini", "informations/a-b.ini", "sub1/deep/f", "sub2/f"})
+                                 "informations/z.v2.ini", "informations/a-b.ini"})
             QVERIFY(writeFile(root + QString::fromLatin1(name), "x"));
-        // Sorted by stem: "a-b" after "A" although "-" comes before ".".
+        // "a-b" after "A" although "-" comes before ".".
         QCOMPARE(listInformationFiles(root),
                  QStringList({QStringLiteral("A.ini"), QStringLiteral("a-b.ini"), QStringLiteral("b.ini"),
                               QStringLiteral("c.INI"), QStringLiteral("z.v2.ini")}));
-        QCOMPARE(listFileStems(root + QStringLiteral("informations"), QStringLiteral("*.txt")), QStringList{QStringLiteral("x")});
-        QVERIFY(listFileStems(root + QStringLiteral("nothing"), QStringLiteral("*.ini")).isEmpty());
-        QStringList flat = listSubfolders(root, false);
-        flat.sort();
-        QCOMPARE(flat, QStringList({root + QStringLiteral("informations"), root + QStringLiteral("sub1"),
-                                    root + QStringLiteral("sub2")}));
-        QCOMPARE(listSubfolders(root, true).size(), 4);
-        QVERIFY(listSubfolders(root + QStringLiteral("nothing"), true).isEmpty());
-        QVERIFY(samePath(QStringLiteral("/A/b/"), QStringLiteral("/a/B/")));
-        QVERIFY(!samePath(QStringLiteral("/a/b"), QStringLiteral("/a/b/")));
-        QVERIFY(fileExists(root + QStringLiteral("sub1")));
-        QVERIFY(!fileExists(QString()));
     }
 
     void cachedReadsMatchFreshReads()
     {
         const QString file = path(QStringLiteral("cached.ini"));
-        QVERIFY(writeFile(file, "[main]\nv=1\nlist=a,b\n"));
-        const QString fresh = readIniValue(file, QStringLiteral("main"), QStringLiteral("v"), true);
-        {
-            IniReadCache cache;
-            QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("v"), true), fresh);
-            QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("V"), true), fresh);
-            QCOMPARE(readIniValue(file, QStringLiteral("main"), QStringLiteral("v"), false), fresh);
-            QCOMPARE(readIniValue(path(QStringLiteral("absent.ini")), QStringLiteral("main"), QStringLiteral("v"), false,
-                                  QStringLiteral("d")),
-                     QStringLiteral("d"));
-            // A write through the layer is seen by the next read.
-            QVERIFY(prependIniListValue(file, QStringLiteral("z"), QStringLiteral("main"), QStringLiteral("list")));
-            QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("list"), QStringLiteral(","), true),
-                     QStringList({QStringLiteral("z"), QStringLiteral("a"), QStringLiteral("b")}));
-            QCOMPARE(readIniList(file, QStringLiteral("main"), QStringLiteral("list"), QStringLiteral(","), false),
-                     QStringList({QStringLiteral("z"), QStringLiteral("a"), QStringLiteral("b")}));
-        }
+        QVERIFY(writeFile(file, "[main]\nv=1\npaths=a,b\n"));
+        IniReadCache cache;
+        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("V")), QStringLiteral("1"));
+        QCOMPARE(value(file, QStringLiteral("main"), QStringLiteral("v"), false), QStringLiteral("1"));
+        // A write through the layer is seen by the next read.
+        QVERIFY(prependIniListValue(file, QStringLiteral("z"), QStringLiteral("main"), QStringLiteral("paths")));
+        QCOMPARE(list(file, QStringLiteral("main")), QStringList({QStringLiteral("z"), QStringLiteral("a"), QStringLiteral("b")}));
+        QCOMPARE(list(file, QStringLiteral("main"), false), QStringList({QStringLiteral("z"), QStringLiteral("a"), QStringLiteral("b")}));
     }
 };
 

@@ -14,7 +14,6 @@
 #include <QPainter>
 #include <QRandomGenerator>
 #include <QProcess>
-#include <QRegularExpression>
 #include <QSignalSpy>
 #include <QTemporaryDir>
 #include <QTest>
@@ -33,63 +32,43 @@ namespace {
 
 using FramePainter = std::function<void(int index, QImage &frame)>;
 
-// Runs a tool to its end; the exit code, or -1 if it didn't run.
-int runTool(const QString &program, const QStringList &args, QByteArray *out = nullptr, QByteArray *err = nullptr)
+// What a tool printed, empty if it failed.
+QByteArray toolOutput(const QString &program, const QStringList &args)
 {
     QProcess p;
     p.start(program, args);
-    if (!p.waitForFinished(60000) || p.exitStatus() != QProcess::NormalExit)
-        return -1;
-    if (out)
-        *out = p.readAllStandardOutput();
-    if (err)
-        *err = p.readAllStandardError();
-    return p.exitCode();
+    if (!p.waitForFinished(60000) || p.exitStatus() != QProcess::NormalExit || p.exitCode() != 0)
+        return QByteArray();
+    return p.readAllStandardOutput();
 }
 
-struct Probe
+// The film's first stream with the container's "format_name" and "comment" beside
+// its own fields, the frames counted.
+QVariantMap probe(const QString &file)
 {
-    QString formatName, codec, frameRate, comment;
-    int width = 0, height = 0, frames = -1;
-};
-
-Probe probe(const QString &file)
-{
-    QByteArray out;
-    Probe r;
-    if (runTool(QStringLiteral("ffprobe"),
-                {QStringLiteral("-v"), QStringLiteral("error"), QStringLiteral("-count_frames"),
-                 QStringLiteral("-show_entries"),
-                 QStringLiteral("stream=codec_name,width,height,r_frame_rate,nb_read_frames:format=format_name:"
-                                "format_tags=comment"),
-                 QStringLiteral("-of"), QStringLiteral("json"), file},
-                &out)
-        != 0)
-        return r;
-    const QJsonObject root = QJsonDocument::fromJson(out).object();
-    const QJsonObject stream = root.value(QStringLiteral("streams")).toArray().first().toObject();
+    const QJsonObject root = QJsonDocument::fromJson(toolOutput(
+        QStringLiteral("ffprobe"),
+        {"-v", "error", "-count_frames", "-show_entries",
+         "stream=codec_name,width,height,r_frame_rate,nb_read_frames:format=format_name:format_tags=comment", "-of",
+         "json", file})).object();
+    QVariantMap fields = root.value(QStringLiteral("streams")).toArray().first().toObject().toVariantMap();
     const QJsonObject format = root.value(QStringLiteral("format")).toObject();
-    r.formatName = format.value(QStringLiteral("format_name")).toString();
-    r.comment = format.value(QStringLiteral("tags")).toObject().value(QStringLiteral("comment")).toString();
-    r.codec = stream.value(QStringLiteral("codec_name")).toString();
-    r.frameRate = stream.value(QStringLiteral("r_frame_rate")).toString();
-    r.width = stream.value(QStringLiteral("width")).toInt();
-    r.height = stream.value(QStringLiteral("height")).toInt();
-    r.frames = stream.value(QStringLiteral("nb_read_frames")).toString().toInt();
-    return r;
+    fields.insert(QStringLiteral("format_name"), format.value(QStringLiteral("format_name")).toString());
+    fields.insert(QStringLiteral("comment"), format.value(QStringLiteral("tags")).toObject().value(QStringLiteral("comment")).toString());
+    return fields;
+}
+
+int framesOf(const QString &file)
+{
+    return probe(file).value(QStringLiteral("nb_read_frames")).toInt();
 }
 
 // Every frame of a film decoded to RGB.
 QVector<QImage> decode(const QString &file, QSize size)
 {
-    QByteArray out;
+    const QByteArray out =
+        toolOutput(QStringLiteral("ffmpeg"), {"-v", "error", "-i", file, "-f", "rawvideo", "-pix_fmt", "rgb24", "-"});
     QVector<QImage> frames;
-    if (runTool(QStringLiteral("ffmpeg"),
-                {QStringLiteral("-v"), QStringLiteral("error"), QStringLiteral("-i"), file, QStringLiteral("-f"),
-                 QStringLiteral("rawvideo"), QStringLiteral("-pix_fmt"), QStringLiteral("rgb24"), QStringLiteral("-")},
-                &out)
-        != 0)
-        return frames;
     const int bytes = size.width() * size.height() * 3;
     for (int at = 0; at + bytes <= out.size(); at += bytes)
         frames.append(QImage(reinterpret_cast<const uchar *>(out.constData() + at), size.width(), size.height(),
@@ -98,13 +77,13 @@ QVector<QImage> decode(const QString &file, QSize size)
     return frames;
 }
 
-// Names of the top-level boxes of an MP4 file, in file order.
-QStringList topLevelBoxes(const QString &file)
+// Whether the index box of an MP4 file comes before its media data, so that playback
+// can start before the whole file is read.
+bool indexBeforeData(const QString &file)
 {
-    QStringList names;
     QFile f(file);
     if (!f.open(QIODevice::ReadOnly))
-        return names;
+        return false;
     while (!f.atEnd()) {
         const qint64 start = f.pos();
         const QByteArray head = f.read(8);
@@ -113,7 +92,10 @@ QStringList topLevelBoxes(const QString &file)
         quint64 size = 0;
         for (int i = 0; i < 4; ++i)
             size = (size << 8) | uchar(head[i]);
-        names << QString::fromLatin1(head.mid(4, 4));
+        if (head.mid(4, 4) == "moov")
+            return true;
+        if (head.mid(4, 4) == "mdat")
+            return false;
         if (size == 1) { // 64-bit size follows
             size = 0;
             for (char c : f.read(8))
@@ -122,7 +104,7 @@ QStringList topLevelBoxes(const QString &file)
         if (size < 8 || !f.seek(start + qint64(size)))
             break;
     }
-    return names;
+    return false;
 }
 
 bool near(QRgb a, QColor b, int tolerance)
@@ -182,7 +164,8 @@ private:
     QString path(const QString &name) const { return m_dir.filePath(name); }
 
     // A whole export on a worker thread; false if the worker refused to start or hung.
-    static bool exportFilm(const QString &file, bool mp4, int frames, QSize frameSize, const FramePainter &painter)
+    static bool exportFilm(const QString &file, bool mp4, int frames, QSize frameSize,
+                           const FramePainter &painter = fill)
     {
         auto *worker = new ExportWorker;
         if (!worker->start(frameSize.width(), frameSize.height(), 30.0, file, mp4)) {
@@ -217,22 +200,18 @@ private slots:
 
     void sizeFollowsWidthAtSixteenByNine()
     {
-        QCOMPARE(ExportWorker::exportSize(1920), QSize(1920, 1080));
-        QCOMPARE(ExportWorker::exportSize(3840), QSize(3840, 2160));
         QCOMPARE(ExportWorker::exportSize(1000), QSize(992, 558));
-        QCOMPARE(ExportWorker::exportSize(1279), QSize(1280, 720)); // 79 is odd: rounds up to 80
-        QCOMPARE(ExportWorker::exportSize(16), QSize(32, 18));
+        QCOMPARE(ExportWorker::exportSize(1279), QSize(1280, 720)); // 79 sixteenths is odd: rounds up to 80
         QVERIFY(ExportWorker::exportSize(15).isEmpty());
         QVERIFY(ExportWorker::exportSize(-5).isEmpty());
 
         // The height argument plays no part; the encoder gets the derived size.
         const QString file = path(QStringLiteral("größe 1000.mp4"));
-        QVERIFY(exportFilm(file, true, 3, QSize(1000, 123), fill));
-        QVERIFY(QFile::exists(file));
-        const Probe p = probe(file);
-        QCOMPARE(p.width, 992);
-        QCOMPARE(p.height, 558);
-        QCOMPARE(p.frames, 3);
+        QVERIFY(exportFilm(file, true, 3, QSize(1000, 123)));
+        const QVariantMap p = probe(file);
+        QCOMPARE(p.value("width").toInt(), 992);
+        QCOMPARE(p.value("height").toInt(), 558);
+        QCOMPARE(p.value("nb_read_frames").toInt(), 3);
     }
 
     void film_data()
@@ -251,22 +230,14 @@ private slots:
         QFETCH(QString, container);
         const int frames = 45;
         const QString file = path(QStringLiteral("film.") + ExportWorker::defaultExtension(mp4));
-        QVERIFY(exportFilm(file, mp4, frames, QSize(320, 180), fill));
+        QVERIFY(exportFilm(file, mp4, frames, QSize(320, 180)));
 
-        Probe p = probe(file);
-        QCOMPARE(p.codec, codec);
-        QVERIFY2(p.formatName.contains(container), qPrintable(p.formatName));
-        QCOMPARE(p.width, 320);
-        QCOMPARE(p.height, 180);
-        QCOMPARE(p.frameRate, QStringLiteral("30/1"));
-        QCOMPARE(p.frames, frames);
-        QVERIFY(p.comment.isEmpty());
-        if (mp4) {
-            const QStringList boxes = topLevelBoxes(file);
-            QVERIFY2(boxes.indexOf(QStringLiteral("moov")) >= 0
-                         && boxes.indexOf(QStringLiteral("moov")) < boxes.indexOf(QStringLiteral("mdat")),
-                     qPrintable(boxes.join(',')));
-        }
+        const QVariantMap p = probe(file);
+        QCOMPARE(p.value("codec_name").toString(), codec);
+        QVERIFY2(p.value("format_name").toString().contains(container), qPrintable(p.value("format_name").toString()));
+        QCOMPARE(p.value("width").toInt(), 320);
+        QCOMPARE(p.value("r_frame_rate").toString(), QStringLiteral("30/1"));
+        QVERIFY(!mp4 || indexBeforeData(file));
 
         // Every frame arrives once and in order.
         const QVector<QImage> pictures = decode(file, QSize(320, 180));
@@ -275,45 +246,35 @@ private slots:
             QVERIFY2(near(pictures.at(i).pixel(160, 90), frameColour(i), 10),
                      qPrintable(QStringLiteral("frame %1 is %2").arg(i).arg(pictures.at(i).pixel(160, 90), 0, 16)));
 
-        // The comment goes into the container; the pictures stay as they were.
-        const QString text = VideoComment::text(QStringLiteral("1234"));
-        QCOMPARE(text, QStringLiteral("ZkTourlet|Frame=1234"));
-        QVERIFY(VideoComment::write(file, text));
-        p = probe(file);
-        QCOMPARE(p.comment, text);
-        QCOMPARE(p.codec, codec);
-        QCOMPARE(p.frames, frames);
-        QCOMPARE(p.frameRate, QStringLiteral("30/1"));
-        if (mp4)
-            QVERIFY(topLevelBoxes(file).indexOf(QStringLiteral("moov")) < topLevelBoxes(file).indexOf(QStringLiteral("mdat")));
-        QCOMPARE(QDir(m_dir.path()).entryList({QFileInfo(file).fileName() + QStringLiteral(".*")}), QStringList());
-        // A second comment replaces the first.
-        QVERIFY(VideoComment::write(file, VideoComment::text(QStringLiteral("7"))));
-        QCOMPARE(probe(file).comment, QStringLiteral("ZkTourlet|Frame=7"));
+        // The comment goes into the container, a second one replaces the first, the
+        // pictures stay as they were and no temporary file is left behind.
+        QVERIFY(VideoComment::write(file, QStringLiteral("first")));
+        QVERIFY(VideoComment::write(file, QStringLiteral("second")));
+        QCOMPARE(probe(file).value("comment").toString(), QStringLiteral("second"));
         QCOMPARE(decode(file, QSize(320, 180)).size(), frames);
+        QVERIFY(!mp4 || indexBeforeData(file));
+        QCOMPARE(QDir(m_dir.path()).entryList({QFileInfo(file).fileName() + QStringLiteral(".*")}), QStringList());
     }
 
     void otherAspectIsStretchedToFill()
     {
         // 4:3 frame: a green band over the top quarter, red left half, blue right half.
-        const FramePainter paint = [](int, QImage &frame) {
+        const QColor red(220, 20, 20), blue(20, 20, 220), green(20, 200, 20);
+        const FramePainter paint = [&](int, QImage &frame) {
             QPainter p(&frame);
-            p.fillRect(0, 0, 200, 300, QColor(220, 20, 20));
-            p.fillRect(200, 0, 200, 300, QColor(20, 20, 220));
-            p.fillRect(0, 0, 400, 75, QColor(20, 200, 20));
+            p.fillRect(0, 0, 200, 300, red);
+            p.fillRect(200, 0, 200, 300, blue);
+            p.fillRect(0, 0, 400, 75, green);
         };
         const QString file = path(QStringLiteral("stretch.mp4"));
         QVERIFY(exportFilm(file, true, 2, QSize(400, 300), paint));
         const QVector<QImage> pictures = decode(file, QSize(416, 234));
         QCOMPARE(pictures.size(), 2);
         const QImage &f = pictures.first();
-        const QColor red(220, 20, 20), blue(20, 20, 220), green(20, 200, 20);
-        // Corners and edges are covered: no bars, no cut-off band.
+        // Corners are covered: no bars, no cut-off band; the band keeps its quarter
+        // of the height, the halves their half of the width.
         QVERIFY(near(f.pixel(3, 230), red, 30));
-        QVERIFY(near(f.pixel(412, 230), blue, 30));
-        QVERIFY(near(f.pixel(3, 3), green, 30));
         QVERIFY(near(f.pixel(412, 3), green, 30));
-        // The band keeps its quarter of the height, the halves their half of the width.
         QVERIFY(near(f.pixel(100, 52), green, 30));
         QVERIFY(near(f.pixel(100, 64), red, 30));
         QVERIFY(near(f.pixel(200, 150), red, 30));
@@ -334,9 +295,9 @@ private slots:
         second.finalizeExport();
         QVERIFY(first.hasEncoder());
 
-        QImage frame(320, 180, QImage::Format_RGB32);
         // When the frame is handed back the worker holds no copy of it, so that the next
         // picture is painted in place instead of into a fresh buffer.
+        QImage frame(320, 180, QImage::Format_RGB32);
         int sharedOnReturn = 0;
         connect(&first, &ExportWorker::frameExportFinished, this, [&] { sharedOnReturn += frame.isDetached() ? 0 : 1; });
         for (int i = 0; i < 5; ++i) {
@@ -347,14 +308,13 @@ private slots:
         QSignalSpy finalized(&first, &ExportWorker::finalized);
         first.finalizeExport();
         QCOMPARE(finalized.count(), 1);
-        QVERIFY(!first.hasEncoder());
         QVERIFY(!EncoderLibrary::isLoaded());
-        QCOMPARE(probe(file).frames, 5);
+        QCOMPARE(framesOf(file), 5);
 
         // Once finalized, the same worker may start again.
         QVERIFY(first.start(320, 180, 30.0, path(QStringLiteral("again.mp4")), false));
         first.finalizeExport();
-        QCOMPARE(probe(path(QStringLiteral("again.mp4"))).codec, QStringLiteral("wmv2"));
+        QCOMPARE(probe(path(QStringLiteral("again.mp4"))).value("codec_name").toString(), QStringLiteral("wmv2"));
     }
 
     void finalizeAndFramesWithoutEncoder()
@@ -385,49 +345,35 @@ private slots:
         }
         QVERIFY(!QFile::exists(file)); // an unfinished film is dropped
         QVERIFY(!EncoderLibrary::isLoaded());
-        QVERIFY(!EncoderLibrary::owner());
         const QString next = path(QStringLiteral("after.mp4"));
-        QVERIFY(exportFilm(next, true, 4, QSize(320, 180), fill));
-        QCOMPARE(probe(next).frames, 4);
+        QVERIFY(exportFilm(next, true, 4, QSize(320, 180)));
+        QCOMPARE(framesOf(next), 4);
     }
 
     void startFailuresLeaveNoFile()
     {
         const QString nowhere = path(QStringLiteral("no/such/folder/film.mp4"));
-        QVERIFY(!exportFilm(nowhere, true, 1, QSize(320, 180), fill));
+        QVERIFY(!exportFilm(nowhere, true, 1, QSize(320, 180)));
         QVERIFY(!QFile::exists(nowhere));
-
         const QString tiny = path(QStringLiteral("tiny.mp4"));
-        QVERIFY(!exportFilm(tiny, true, 1, QSize(10, 10), fill));
+        QVERIFY(!exportFilm(tiny, true, 1, QSize(10, 10)));
         QVERIFY(!QFile::exists(tiny));
-
-        const QString blocked = path(QStringLiteral("blocked.wmv"));
-        QVERIFY(QDir().mkpath(blocked)); // a folder where the file should go
-        QVERIFY(!exportFilm(blocked, false, 1, QSize(320, 180), fill));
-        QVERIFY(QFileInfo(blocked).isDir());
 
         // Without the library nothing starts and the format has no extension.
         QTemporaryDir empty;
         EncoderLibrary::release();
         EncoderLibrary::setFolder(empty.path());
         const QString orphan = path(QStringLiteral("orphan.mp4"));
-        QVERIFY(!exportFilm(orphan, true, 1, QSize(320, 180), fill));
+        QVERIFY(!exportFilm(orphan, true, 1, QSize(320, 180)));
         QVERIFY(!QFile::exists(orphan));
         QVERIFY(ExportWorker::defaultExtension(true).isEmpty());
-        QVERIFY(!VideoComment::write(path(QStringLiteral("film.mp4")), QStringLiteral("x")));
         EncoderLibrary::setFolder(QStringLiteral(TOURLET_BIN_DIR));
-
-        QCOMPARE(ExportWorker::defaultExtension(true), QStringLiteral("mp4"));
         QCOMPARE(ExportWorker::defaultExtension(false), QStringLiteral("wmv"));
-        QVERIFY(EncoderLibrary::isLoaded()); // kept for the next query
 
         // A file that isn't a film keeps its content when a comment is asked for.
-        const QString text = path(QStringLiteral("notes.mp4"));
-        QFile f(text);
-        QVERIFY(f.open(QIODevice::WriteOnly));
-        f.write("not a film");
-        f.close();
+        const QString text = writeTestFile(m_dir, QStringLiteral("notes.mp4"), "not a film");
         QVERIFY(!VideoComment::write(text, QStringLiteral("x")));
+        QFile f(text);
         QVERIFY(f.open(QIODevice::ReadOnly));
         QCOMPARE(f.readAll(), QByteArray("not a film"));
     }
@@ -492,8 +438,7 @@ private slots:
         QFETCH(int, exitCode);
         QTemporaryDir dir;
         const QString out = dir.filePath(QStringLiteral("out.") + format);
-        const QString film = dir.filePath(QStringLiteral("earlier film"));
-        writeTestFile(dir, QStringLiteral("earlier film"), "an earlier film");
+        const QString film = writeTestFile(dir, QStringLiteral("earlier film"), "an earlier film");
         if (target == QLatin1String("file"))
             writeTestFile(dir, QStringLiteral("out.") + format, "the previous file");
         else if (target == QLatin1String("link"))
@@ -504,9 +449,7 @@ private slots:
             QVERIFY(QDir().mkpath(out + QStringLiteral("/inside")));
 
         const QMap<QString, QByteArray> before = folderSnapshot(dir.path());
-        const QStringList args = {QStringLiteral("encode"), QStringLiteral("--frames"), QStringLiteral("90"),
-                                  QStringLiteral("--size"), QStringLiteral("640x360"), QStringLiteral("--format"),
-                                  format, QStringLiteral("-o"), out};
+        const QStringList args = {"encode", "--frames", "90", "--size", "640x360", "--format", format, "-o", out};
         const CliRun run = limited ? runCliWithFileSizeLimit(64, args) : runCli(args);
         QCOMPARE(run.exitCode, exitCode);
         const QMap<QString, QByteArray> after = folderSnapshot(dir.path());
@@ -518,7 +461,7 @@ private slots:
         }
         QCOMPARE(after.keys(), before.keys());
         QVERIFY(QFileInfo(out).isSymLink());
-        QCOMPARE(probe(out).frames, 90);
+        QCOMPARE(framesOf(out), 90);
     }
 
     void libraryRefusesBadInput()
@@ -526,19 +469,14 @@ private slots:
         EncoderLibrary::release();
         QVERIFY(EncoderLibrary::load());
         auto create = reinterpret_cast<VidcoreCreateExport>(EncoderLibrary::resolve("CreateExport"));
-        auto extension = reinterpret_cast<VidcoreDefaultExtension>(EncoderLibrary::resolve("DefaultExtension"));
-        QVERIFY(create && extension);
+        QVERIFY(create);
         QVERIFY(!create(3));
-        QCOMPARE(QString::fromWCharArray(extension(3)), QString());
 
         VidcoreExport *encoder = create(VidcoreFormatMp4);
         QVERIFY(encoder);
         const VidcoreOperations &op = *encoder->operations;
         VidcoreParameters record;
         op.getParameters(encoder, &record);
-        QCOMPARE(record.bitRate, 40000000);
-        QCOMPARE(record.targetFrameRate, 30.0);
-
         const QString file = path(QStringLiteral("direct.mp4"));
         const std::wstring name = file.toStdWString();
         const auto openWith = [&](uint32_t w, uint32_t h, double rate) {
@@ -550,101 +488,75 @@ private slots:
         };
         QVERIFY(!openWith(321, 180, 30.0));
         QVERIFY(!openWith(320, 0, 30.0));
-        QVERIFY(!openWith(320, 180, 0.0));
         QVERIFY(!openWith(320, 180, std::nan("")));
-        QVERIFY(!QFile::exists(file));
         QVERIFY(!op.open(encoder, nullptr, &record));
+        QVERIFY(!QFile::exists(file));
 
         QVERIFY(openWith(320, 180, 25.0));
         QVERIFY(!openWith(320, 180, 25.0)); // open already
         QImage frame(320, 180, QImage::Format_RGB32);
         frame.fill(Qt::gray);
-        op.writeFrame(encoder, frame.constBits(), uint32_t(frame.sizeInBytes()) - 4, VidcoreNextFrame); // short: dropped
-        op.writeFrame(encoder, nullptr, uint32_t(frame.sizeInBytes()), VidcoreNextFrame);
-        op.writeFrame(encoder, frame.constBits(), uint32_t(frame.sizeInBytes()), VidcoreNextFrame);
-        op.writeFrame(encoder, frame.constBits(), uint32_t(frame.sizeInBytes()), 0); // behind: taken as next
+        const uint32_t bytes = uint32_t(frame.sizeInBytes());
+        op.writeFrame(encoder, frame.constBits(), bytes - 4, VidcoreNextFrame); // short: dropped
+        op.writeFrame(encoder, nullptr, bytes, VidcoreNextFrame);
+        op.writeFrame(encoder, frame.constBits(), bytes, VidcoreNextFrame);
+        op.writeFrame(encoder, frame.constBits(), bytes, 0); // behind: taken as next
         op.finish(encoder);
-        op.writeFrame(encoder, frame.constBits(), uint32_t(frame.sizeInBytes()), VidcoreNextFrame); // after the end
+        op.writeFrame(encoder, frame.constBits(), bytes, VidcoreNextFrame); // after the end
         op.finish(encoder);
         op.close(encoder);
         op.close(encoder);
         EncoderLibrary::release();
 
-        const Probe p = probe(file);
-        QCOMPARE(p.frames, 2);
-        QCOMPARE(p.frameRate, QStringLiteral("25/1"));
+        QCOMPARE(framesOf(file), 2);
+        QCOMPARE(probe(file).value("r_frame_rate").toString(), QStringLiteral("25/1"));
     }
 
     void frameDumpsArePngs()
     {
         QGrabWidgetFrame dump;
-        const QString base = path(QStringLiteral("dump"));
-        dump.start(base);
-        QSignalSpy finished(&dump, &QGrabWidgetFrame::frameExportFinished);
+        dump.start(path(QStringLiteral("dump")));
         QImage frame(48, 27, QImage::Format_RGB32);
         for (int i = 0; i < 3; ++i) {
             fill(i, frame);
             dump.exportNextFrame(i + 10, &frame);
         }
-        QCOMPARE(finished.count(), 3);
-        const QRegularExpression name(QRegularExpression::escape(base) + QStringLiteral("_frame_\\d{1,6}_0000000[0-2]\\.png"));
+        // Numbered by the dump's own count, not by the frame number given.
         for (int i = 0; i < 3; ++i) {
             const QString file = dump.frameFileName(i);
-            QVERIFY2(name.match(file).hasMatch(), qPrintable(file));
-            const QImage back(file);
-            QCOMPARE(back.size(), QSize(48, 27));
-            QVERIFY(near(back.pixel(5, 5), frameColour(i), 0));
+            QVERIFY2(file.endsWith(QStringLiteral("_0000000%1.png").arg(i)), qPrintable(file));
+            QVERIFY(near(QImage(file).pixel(5, 5), frameColour(i), 0));
         }
-        QSignalSpy finalized(&dump, &QGrabWidgetFrame::finalized);
-        dump.finalizeExport();
-        QCOMPARE(finalized.count(), 1);
     }
 
     void commandLine()
     {
-        const QString cli = QStringLiteral(TOURLET_BIN_DIR "/tourlet-cli");
         const QString file = path(QStringLiteral("cli.wmv"));
-        QByteArray out, err;
-        QCOMPARE(runTool(cli,
-                         {QStringLiteral("encode"), QStringLiteral("--frames"), QStringLiteral("30"),
-                          QStringLiteral("--size"), QStringLiteral("320x240"), QStringLiteral("--format"),
-                          QStringLiteral("wmv"), QStringLiteral("--comment"), QStringLiteral("ZkTourlet|Frame=3"),
-                          QStringLiteral("-o"), file},
-                         &out, &err),
-                 0);
-        const QJsonObject result = QJsonDocument::fromJson(out).object();
+        const CliRun run = runCli({"encode", "--frames", "30", "--size", "320x240", "--format", "wmv", "--comment",
+                                   "ZkTourlet|Frame=3", "-o", file});
+        QCOMPARE(run.exitCode, 0);
+        const QJsonObject result = QJsonDocument::fromJson(run.out).object();
         QCOMPARE(result.value(QStringLiteral("frames")).toInt(), 30);
-        QCOMPARE(result.value(QStringLiteral("width")).toInt(), 320);
         QCOMPARE(result.value(QStringLiteral("height")).toInt(), 180);
-        QVERIFY(result.value(QStringLiteral("seconds")).toDouble() > 0.0);
         QVERIFY(result.value(QStringLiteral("framesPerSecond")).toDouble() > 0.0);
-        const Probe p = probe(file);
-        QCOMPARE(p.codec, QStringLiteral("wmv2"));
-        QCOMPARE(p.frames, 30);
-        QCOMPARE(p.comment, QStringLiteral("ZkTourlet|Frame=3"));
+        QCOMPARE(framesOf(file), 30);
+        QCOMPARE(probe(file).value("comment").toString(), QStringLiteral("ZkTourlet|Frame=3"));
 
-        // Failures: exit 1, one line, no file.
+        // Without the encoder library beside it: exit 1, one line naming it, no file.
         const QString missing = path(QStringLiteral("missing.mp4"));
-        const QStringList encodeOne = {QStringLiteral("encode"), QStringLiteral("--frames"), QStringLiteral("2"),
-                                       QStringLiteral("--size"), QStringLiteral("320x180"), QStringLiteral("-o")};
         QTemporaryDir alone;
         const QString lonely = alone.filePath(QStringLiteral("tourlet-cli"));
-        QVERIFY(QFile::copy(cli, lonely));
-        QCOMPARE(runTool(lonely, encodeOne + QStringList{missing}, &out, &err), 1);
+        QVERIFY(QFile::copy(QStringLiteral(TOURLET_CLI), lonely));
+        QProcess process;
+        process.start(lonely, {"encode", "--frames", "2", "--size", "320x180", "-o", missing});
+        QVERIFY(process.waitForFinished(60000));
+        QCOMPARE(process.exitCode(), 1);
+        const QByteArray err = process.readAllStandardError();
         QCOMPARE(err.count('\n'), 1);
         QVERIFY2(err.contains("libvidcore.so"), err.constData());
-        QVERIFY(!QFile::exists(missing));
 
-        const QString unwritable = path(QStringLiteral("none/x.mp4"));
-        QCOMPARE(runTool(cli, encodeOne + QStringList{unwritable}, &out, &err), 1);
-        QCOMPARE(err.count('\n'), 1);
-        QVERIFY(out.isEmpty());
-        QVERIFY(!QFile::exists(unwritable));
-
-        QCOMPARE(runTool(cli, {QStringLiteral("encode"), QStringLiteral("--frames"), QStringLiteral("0"),
-                               QStringLiteral("-o"), missing}, &out, &err), 1);
-        QCOMPARE(runTool(cli, {QStringLiteral("encode"), QStringLiteral("--frames"), QStringLiteral("2"),
-                               QStringLiteral("--format"), QStringLiteral("avi"), QStringLiteral("-o"), missing}, &out, &err), 1);
+        QCOMPARE(runCli({"encode", "--frames", "0", "-o", missing}).exitCode, 1);
+        QCOMPARE(runCli({"encode", "--frames", "2", "--format", "avi", "-o", missing}).exitCode, 1);
         QVERIFY(!QFile::exists(missing));
     }
 };
