@@ -2,7 +2,6 @@
 #include "path/GeoDistance.h"
 #include "path/NearestSample.h"
 #include "path/Path.h"
-#include "path/PathMode.h"
 
 #include <QGeoCoordinate>
 #include <QRandomGenerator>
@@ -11,7 +10,6 @@
 #include <algorithm>
 #include <cmath>
 #include <limits>
-#include <random>
 
 namespace {
 
@@ -307,13 +305,6 @@ private slots:
         QCOMPARE(path.curvePointCountBetween(0.6, 0.5), -1);
         QCOMPARE(path.curvePointCountBetween(0.5, 2.0), -1);
 
-        QCOMPARE(path.findPoint(path.keyPoints[1].id), static_cast<BasePoint *>(&path.keyPoints[1]));
-        QCOMPARE(path.findPoint(path.curvePoints[3].id), static_cast<BasePoint *>(&path.curvePoints[3]));
-        QVERIFY(!path.findPoint(0));
-        uint32_t seg = 0;
-        QCOMPARE(path.nextSegment(seg), &path.pathSegments[0]);
-        QCOMPARE(path.nextSegment(seg), &path.pathSegments[1]);
-        QVERIFY(!path.nextSegment(seg));
 
         double smallest = 0;
         QVERIFY(!path.hitTest(0.0, 0.0, 0.0, smallest, true)); // a tolerance of 0 never matches
@@ -325,50 +316,6 @@ private slots:
         const BasePoint *onCurve = path.hitTest(0.5, 0.5, 2000, smallest, true);
         QVERIFY(onCurve && dynamic_cast<const CurvePoint *>(onCurve));
         QVERIFY(!path.hitTest(0.5, 0.5, 2000, smallest, false));
-    }
-
-    void nearestSampleOfAWalkOverAll()
-    {
-        // Samples over the globe, on both sides of the antimeridian, near a pole, and some
-        // on the same place: the search finds what a walk over every sample finds, the
-        // first of equally near ones.
-        Path path;
-        std::mt19937 random(7);
-        std::uniform_real_distribution<double> anyLon(-180, 180), anyLat(-90, 90), near(-0.5, 0.5);
-        auto wrapped = [](double lon) { return lon > 180 ? lon - 360 : lon < -180 ? lon + 360 : lon; };
-        for (int i = 0; i < 3000; ++i) {
-            if (i % 3 == 0)
-                path.addCurvePoint(anyLon(random), anyLat(random), 0);
-            else if (i % 3 == 1)
-                path.addCurvePoint(wrapped(179.9 + near(random)), 10 + near(random), 0);
-            else
-                path.addCurvePoint(anyLon(random), 89.6 + near(random) * 0.8, 0);
-        }
-        for (size_t i = 2000; i < 2100; ++i) {
-            path.curvePoints[i].x = path.curvePoints[i - 1500].x;
-            path.curvePoints[i].y = path.curvePoints[i - 1500].y;
-        }
-        auto walk = [&](double x, double y, size_t from, size_t to) {
-            const GeoDistanceFrom origin(y, x);
-            int nearest = -1;
-            double best = std::numeric_limits<double>::infinity();
-            for (size_t i = from; i < to; ++i) {
-                const double d = origin.term(path.curvePoints[i].y, path.curvePoints[i].x);
-                if (d < best) {
-                    best = d;
-                    nearest = int(i);
-                }
-            }
-            return nearest;
-        };
-        for (int q = 0; q < 300; ++q) {
-            const CurvePoint &on = path.curvePoints[size_t(q * 7 + 1)];
-            const double x = q % 2 ? anyLon(random) : wrapped(on.x + near(random) * 0.01);
-            const double y = q % 2 ? anyLat(random) : std::max(-90.0, std::min(90.0, on.y + near(random) * 0.01));
-            QCOMPARE(path.nearestCurvePoint(x, y, 0, 3000), walk(x, y, 0, 3000));
-            QCOMPARE(path.nearestCurvePoint(x, y, 700, 1100), walk(x, y, 700, 1100));
-        }
-        QCOMPARE(path.nearestCurvePoint(0, 0, 5, 5), -1);
     }
 
     void distanceMatchesQt()
@@ -383,7 +330,9 @@ private slots:
     {
         // Random routes of wandering runs, with jumps over the antimeridian and to
         // the poles, repeated places (ties) and now and then a sample that is no
-        // valid coordinate; places near samples, on them, far off and invalid.
+        // valid coordinate; places near samples, on them, far off and invalid. Both
+        // searches, the tree's and the path's over a range, find what a walk over
+        // every sample finds: the first of equally near ones.
         QRandomGenerator random(31337);
         auto uniform = [&](double low, double high) { return low + (high - low) * random.generateDouble(); };
         int found = 0;
@@ -409,6 +358,19 @@ private slots:
                     samples.emplace_back(lon, lat, 0.0);
             }
             const NearestSample nearest(samples);
+            Path path;
+            path.curvePoints = samples;
+            auto walk = [&](const GeoDistanceFrom &from, double best, size_t first, size_t last) {
+                int index = -1;
+                for (size_t i = first; i < last; ++i) {
+                    const double d = from.term(samples[i].y, samples[i].x);
+                    if (d < best) {
+                        best = d;
+                        index = int(i);
+                    }
+                }
+                return index;
+            };
             for (int query = 0; query < 200; ++query) {
                 const CurvePoint &near = samples[size_t(random.bounded(count))];
                 double qlat = near.y, qlon = near.x;
@@ -421,17 +383,12 @@ private slots:
                 const double limit = query % 5 == 0 ? GeoDistanceFrom::metresToTerm(uniform(1, 1e5))
                                                     : GeoDistanceFrom::metresToTerm(1e7);
                 const GeoDistanceFrom from(qlat, qlon);
-                int expected = -1;
-                double best = limit;
-                for (size_t i = 0; i < samples.size(); ++i) {
-                    const double d = from.term(samples[i].y, samples[i].x);
-                    if (d < best) {
-                        best = d;
-                        expected = int(i);
-                    }
-                }
+                const int expected = walk(from, limit, 0, samples.size());
                 QCOMPARE(nearest.find(qlat, qlon, limit), expected);
                 found += expected >= 0;
+                const size_t first = random.bounded(count), last = first + random.bounded(count - int(first) + 1);
+                QCOMPARE(path.nearestCurvePoint(qlon, qlat, first, last),
+                         walk(from, std::numeric_limits<double>::infinity(), first, last));
             }
         }
         QVERIFY(found > 4000);
@@ -461,19 +418,6 @@ private slots:
         path.pathSegments.pop_back();
         QTest::ignoreMessage(QtDebugMsg, "initCorrespondingObjectIds: number of pathsegments not equal to number ob keypoints");
         path.initCorrespondingObjectIds();
-    }
-
-    void pathModeTable()
-    {
-        QCOMPARE(PathMode::map(PathMode::Line)->curveMode, CurveMode::Straight);
-        QCOMPARE(PathMode::map(PathMode::Curve)->curveMode, CurveMode::Smooth);
-        QCOMPARE(PathMode::map(PathMode::Airplane)->curveMode, CurveMode::Arc);
-        QCOMPARE(PathMode::map(PathMode::Route)->curveMode, CurveMode::Straight);
-        QCOMPARE(PathMode::map(PathMode::Route)->drawMode, 0);
-        QCOMPARE(PathMode::map(PathMode::Line)->drawMode, 1);
-        QVERIFY(!PathMode::map(4));
-        QCOMPARE(PathMode::fromName(QStringLiteral("airplane")), PathMode::Airplane);
-        QCOMPARE(PathMode::fromName(QStringLiteral("Airplane")), -1);
     }
 
     void gapFillingOnLargeNumbers()

