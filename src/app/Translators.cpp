@@ -4,6 +4,7 @@
 #include "app/Trace.h"
 
 #include <QCoreApplication>
+#include <QFileInfo>
 #include <QTranslator>
 
 namespace {
@@ -16,7 +17,9 @@ Translators::Translators(AppSettings &settings, const QString &programDir)
     for (int i = 0; i < LanguageTable::Count; ++i) {
         m_table[i] = std::make_unique<QTranslator>();
         const QString file = LanguageTable::filePath(i, programDir);
-        if (!m_table[i]->load(file))
+        // load() would fall back to "Tourlet.qm" for a missing file, showing the
+        // installer's language under another language's name.
+        if (!QFileInfo(file).isFile() || !m_table[i]->load(file))
             logTrace(1, QStringLiteral("Translators: can't load %s"), file);
     }
     if (!registered)
@@ -39,8 +42,10 @@ Translators *Translators::instance()
 bool Translators::install(uint32_t index)
 {
     const uint32_t resolved = LanguageTable::resolveRequest(index, m_programDir);
-    if (m_current >= 0)
+    if (m_current >= 0) {
         QCoreApplication::removeTranslator(m_table[m_current].get());
+        m_current = -1;
+    }
     if (resolved >= static_cast<uint32_t>(LanguageTable::Count)) {
         logTrace(1, QStringLiteral("Translators::install: %d is no language"), resolved);
         return false;
