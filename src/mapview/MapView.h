@@ -358,17 +358,21 @@ private:
     void newProjectCommand();
     void resetViews();
     void loadProjectCommand(bool track);
-    void startLoad(const QString &fileName);
-    bool saveAndRun(void (MapView::*next)());
     void loadProjectFromDialog() { loadProjectCommand(false); }
     void loadTrackFromDialog() { loadProjectCommand(true); }
-    void closeAfterSave() { emit closeApp(); }
-    void newProjectAfterSave() { newProjectCommand(); }
+    void startLoad(const QString &fileName);
+    void emitCloseApp() { emit closeApp(); }
+    void saveThenClose();
+    void saveThenNewProject();
+    void saveThenLoadProject();
+    void saveThenLoadTrack();
+    void sendVideo();
+    void showTutorial();
     void rebuildLocationSettings();
     void rebuildDebugPages();
     void updateSceneSize();
-    void showTutorial();
     QString applicationTitle() const;
+    int currentLanguage() const;
     // Frames of the chosen film length.
     int32_t chosenFrames() const;
 
@@ -388,6 +392,8 @@ private:
 
     QWidget *m_window = nullptr;
     QString m_projectFileName;
+    // The film of the last finished export, which "actionSendVideo" hands to the host.
+    QString m_lastExportFile;
     QVariantMap m_locationSettings;
     QVariantList m_debugInfoPages;
     QVariantList m_animationFrames;
