@@ -170,17 +170,12 @@ QString MapView::applicationTitle() const
     return QCoreApplication::applicationName();
 }
 
-QString MapView::windowTitle() const
-{
-    return m_window ? m_window->windowTitle() : title();
-}
-
 void MapView::setWindowTitle(const QString &text)
 {
     if (m_window)
         m_window->setWindowTitle(text);
-    else
-        setTitle(text);
+    // The interface shows it too, as the view's own title.
+    setTitle(text);
 }
 
 void MapView::updateSceneSize()
@@ -515,12 +510,12 @@ bool MapView::saveProject()
 
 void MapView::setProjectModified(bool modified)
 {
-    QString title = windowTitle();
-    if (modified && !title.endsWith(modifiedMark))
-        title += modifiedMark;
-    else if (!modified && title.endsWith(modifiedMark))
-        title.chop(modifiedMark.size());
-    setWindowTitle(title);
+    QString text = title();
+    if (modified && !text.endsWith(modifiedMark))
+        text += modifiedMark;
+    else if (!modified && text.endsWith(modifiedMark))
+        text.chop(modifiedMark.size());
+    setWindowTitle(text);
     m_projectModified = modified;
     emit projectModifiedChanged();
 }
@@ -905,9 +900,9 @@ void MapView::setFullScreenDiashow(bool state)
 void MapView::setStrings(QVariantMap stringMap)
 {
     m_mainController.setStrings(stringMap);
+    // Not the language list: the interface answers its change by sending the strings.
     emit gpxAliasingCBEntriesChanged();
     emit maxAnimationDurationCBEntriesChanged();
-    emit languageCBEntriesChanged();
 }
 
 QString MapView::versionInfo() const

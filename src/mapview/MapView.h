@@ -354,7 +354,6 @@ private:
     void connectSignalList(QObject *signalList);
     void setProjectModified(bool modified);
     void setWindowTitle(const QString &title);
-    QString windowTitle() const;
     void newProjectCommand();
     void resetViews();
     void loadProjectCommand(bool track);

@@ -331,7 +331,8 @@ void tst_MapView::listTitlesAreKeysUntilStringsArrive()
 
     QSignalSpy languageList(&stage.view, &MapView::languageCBEntriesChanged);
     QVERIFY(stage.view.setProperty("strHostStrings", texts));
-    QCOMPARE(languageList.count(), 1);
+    // The interface answers a change of the language list by sending its strings again.
+    QCOMPARE(languageList.count(), 0);
     for (const char *list : lists) {
         int selected = 0;
         for (const QVariant &entry : stage.view.property(list).toList()) {
