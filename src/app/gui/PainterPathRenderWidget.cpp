@@ -53,6 +53,7 @@ void PainterPathRenderWidget::init()
     connect(m_mapView, &MapView::closeApp, this, &PainterPathRenderWidget::closeApp);
     connect(m_mapView, &MapView::requestUpdate, this, &PainterPathRenderWidget::requestUpdate);
     connect(m_mapView, &MapView::setFullScreen, this, &PainterPathRenderWidget::setFullScreen);
+    connect(this, &PainterPathRenderWidget::leaveFullscreen, m_mapView, &MapView::leaveFullscreen);
 
     if (const QScreen *screen = QGuiApplication::primaryScreen()) {
         m_width = screen->availableGeometry().width() - m_frameWidth;
