@@ -16,15 +16,13 @@ bool isHostSwitch(const QString &argument)
 StartSwitches readStartSwitches(const QStringList &arguments)
 {
     StartSwitches switches;
+    switches.noBlacklist = arguments.contains(StartSwitch::NoBlacklist);
+    switches.logging = arguments.contains(StartSwitch::Logging);
     for (int i = 1; i < arguments.size(); ++i) {
         const QString &argument = arguments.at(i);
         if (argument == EndOfOptions)
             break;
-        if (argument == StartSwitch::NoBlacklist)
-            switches.noBlacklist = true;
-        else if (argument == StartSwitch::Logging)
-            switches.logging = true;
-        else if (argument == QLatin1String("--help") || argument == QLatin1String("-h"))
+        if (argument == QLatin1String("--help") || argument == QLatin1String("-h"))
             switches.help = true;
         else if (argument == QLatin1String("--version"))
             switches.version = true;

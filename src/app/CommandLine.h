@@ -18,11 +18,12 @@ struct StartSwitches
 };
 
 // Reads the switches from the whole command line, the program's name first.
-// Nothing after "--" counts as a switch.
+// "/noblacklist" and "/logging" count wherever they stand; "--help" and "--version"
+// only before "--".
 StartSwitches readStartSwitches(const QStringList &arguments);
 
-// The arguments without "/noblacklist" and "/logging", which must not reach the
-// reader of the host program's switches.
+// The arguments without any "/noblacklist" and "/logging", which must not reach the
+// reader of the host program's switches nor be taken for a file.
 QStringList withoutStartSwitches(const QStringList &arguments);
 
 // The project or track file named on the command line, as an absolute path against
