@@ -72,7 +72,6 @@ QString filmTime(int32_t frames, double position)
 MapView::MapView(PainterPathRenderer_Controller *document, QWindow *parent, const AppSettings &settings)
     : QQuickView(parent), m_mainController(document, settings), m_document(document)
 {
-    m_frameTick.setSingleShot(true);
 }
 
 MapView::~MapView() = default;

@@ -2,11 +2,9 @@
 
 #include "mapview/QMainController.h"
 
-#include <QElapsedTimer>
 #include <QGeoCoordinate>
 #include <QQuickView>
 #include <QSize>
-#include <QTimer>
 #include <QUrl>
 #include <QVariantList>
 #include <QVariantMap>
@@ -209,6 +207,7 @@ public:
     bool sendExportToHost() const;
     bool projectModified() const { return m_projectModified; }
     bool isFirstStart() const { return m_mainController.isFirstStart(); }
+    // The document carries no debug switch: the overlay is reached by debugInfoActive.
     bool debug() const { return false; }
     bool enableBetaPatches() const;
     bool getStrings() const { return true; }
@@ -375,20 +374,15 @@ private:
     // Frames of the chosen film length.
     int32_t chosenFrames() const;
 
-    // 1. the embedding widget, owned by the window as its child
-    QWidget *m_container = nullptr;
-    // 4.
+    // Members are made in the order of ownership and go in reverse. The exporter and
+    // the background chooser take their places ahead of the main controller, the usage
+    // tracking and the item models theirs at the end.
+    QWidget *m_container = nullptr; // the embedding widget, a child of the window
     QMainController m_mainController;
-    // 5.
     PainterPathRenderer_Controller *m_document;
-    // 6.
     QSize m_windowSize;
     QString m_debugText;
     QGeoCoordinate m_mouseOverPathPosition;
-    // 7. the frame timer
-    QElapsedTimer m_frameTimer;
-    QTimer m_frameTick;
-
     QWidget *m_window = nullptr;
     QString m_projectFileName;
     // The film of the last finished export, which "actionSendVideo" hands to the host.
