@@ -88,10 +88,8 @@ private slots:
     {
         QTest::addColumn<int>("availableHeight");
         QTest::addColumn<double>("scale");
-        QTest::newRow("full HD") << 1040 << 1.0;
         QTest::newRow("at the threshold") << 1450 << 1.0;
         QTest::newRow("one above") << 1451 << 2.0;
-        QTest::newRow("4K") << 2120 << 2.0;
     }
 
     void scaleThreshold()
