@@ -14,10 +14,12 @@ Dialog {
         open()
     }
 
-    parent: Overlay.overlay
     anchors.centerIn: parent
     width: Math.min(Theme.dialogWidth, parent ? parent.width - 2 * Theme.spaceXL : Theme.dialogWidth)
     modal: true
+    Overlay.modal: Rectangle {
+        color: Theme.scrim
+    }
     closePolicy: Popup.CloseOnEscape
     padding: Theme.spaceXL
     bottomPadding: Theme.spaceL
@@ -47,6 +49,7 @@ Dialog {
             Layout.topMargin: Theme.spaceS
             text: qsTr("OK")
             highlighted: true
+            font.capitalization: Font.MixedCase
             focus: true
             onClicked: box.close()
         }

@@ -27,10 +27,12 @@ Dialog {
         actionChosen(confirmedActionId)
     }
 
-    parent: Overlay.overlay
     anchors.centerIn: parent
     width: Math.min(Theme.dialogWidth, parent ? parent.width - 2 * Theme.spaceXL : Theme.dialogWidth)
     modal: true
+    Overlay.modal: Rectangle {
+        color: Theme.scrim
+    }
     closePolicy: Popup.CloseOnEscape
     padding: Theme.spaceXL
     bottomPadding: Theme.spaceL
@@ -53,6 +55,7 @@ Dialog {
             Layout.alignment: Qt.AlignRight
             text: qsTr("OK")
             highlighted: true
+            font.capitalization: Font.MixedCase
             focus: true
             onClicked: box.answer()
         }

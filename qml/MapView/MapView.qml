@@ -1,6 +1,5 @@
 import QtQuick 2.15
 import QtQuick.Controls 2.15
-import QtQuick.Controls.Material 2.15
 import "../Theme"
 import "SignalLists"
 
@@ -11,10 +10,6 @@ Item {
 
     width: host.windowSize && host.windowSize.width > 0 ? host.windowSize.width : 1280
     height: host.windowSize && host.windowSize.height > 0 ? host.windowSize.height : 800
-
-    Material.theme: Material.Light
-    Material.accent: Theme.accent
-    Material.foreground: Theme.ink
 
     readonly property var actions: host.messageBoxAction
     readonly property bool modalOpen: messageBox.visible || hintBox.visible
@@ -89,6 +84,13 @@ Item {
         onExportGpxRequested: host.exportGPX()
         onLanguageChosen: signalList.setLanguage(index)
         onFullScreenRequested: host.toggleFullScreen()
+    }
+
+    // Quitting asks about unsaved changes as closing the window does.
+    Shortcut {
+        sequence: StandardKey.Quit
+        enabled: !root.modalOpen
+        onActivated: host.handleCloseApp()
     }
 
     MessageBox {

@@ -80,6 +80,7 @@ Dialog {
             highlighted: modelData.primary
             flat: !modelData.primary
             focus: modelData.primary
+            font.capitalization: Font.MixedCase
             onClicked: box.answer(modelData.actionId)
         }
     }
@@ -90,10 +91,12 @@ Dialog {
         actionChosen(actionId)
     }
 
-    parent: Overlay.overlay
     anchors.centerIn: parent
     width: Math.min(Theme.dialogWidth, parent ? parent.width - 2 * Theme.spaceXL : Theme.dialogWidth)
     modal: true
+    Overlay.modal: Rectangle {
+        color: Theme.scrim
+    }
     closePolicy: Popup.CloseOnEscape
     padding: Theme.spaceXL
     bottomPadding: Theme.spaceL

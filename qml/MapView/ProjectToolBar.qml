@@ -94,6 +94,7 @@ Control {
             text: qsTr("Language")
             icon.source: "qrc:/Qml/images/language.svg"
             enabled: bar.commandsEnabled
+            toolTipAllowed: !languageMenu.visible
             onClicked: languageMenu.open()
 
             LanguageMenu {

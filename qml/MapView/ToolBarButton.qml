@@ -8,6 +8,8 @@ ToolButton {
     id: button
 
     property alias shortcut: keys.sequence
+    // Off while a menu of the button is open, which the tooltip would cover.
+    property bool toolTipAllowed: true
 
     display: AbstractButton.IconOnly
     implicitWidth: Theme.controlSize
@@ -18,7 +20,7 @@ ToolButton {
     icon.color: enabled ? Theme.ink : Theme.inkMuted
 
     Accessible.name: text
-    ToolTip.visible: hovered || visualFocus
+    ToolTip.visible: (hovered || visualFocus) && toolTipAllowed
     ToolTip.delay: 500
     ToolTip.text: keys.nativeText.length > 0 ? qsTr("%1 (%2)").arg(text).arg(keys.nativeText) : text
 

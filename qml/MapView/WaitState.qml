@@ -15,11 +15,15 @@ Popup {
         open()
     }
 
-    parent: Overlay.overlay
     anchors.centerIn: parent
     modal: true
+    Overlay.modal: Rectangle {
+        color: Theme.scrim
+    }
     dim: true
     closePolicy: Popup.NoAutoClose
+    // Gone at once when the work is done, or when an error box takes its place.
+    exit: null
     padding: Theme.spaceXL
 
     background: Rectangle {

@@ -93,4 +93,10 @@ Item {
             }
         }
     }
+
+    Graticule {
+        anchors.fill: parent
+        map: mapLoader.item
+        visible: map !== null && map.bearing === 0 && map.tilt === 0
+    }
 }

@@ -1,6 +1,5 @@
 import QtQuick 2.15
 import QtQuick.Controls 2.15
-import QtQuick.Controls.Material 2.15
 import QtQuick.Layouts 1.15
 import "../Theme"
 
@@ -11,11 +10,8 @@ Rectangle {
 
     width: host.windowSize && host.windowSize.width > 0 ? host.windowSize.width : 300
     height: host.windowSize && host.windowSize.height > 0 ? host.windowSize.height : 100
-    color: Theme.scrim
-
-    Material.theme: Material.Light
-    Material.accent: Theme.accent
-    Material.foreground: Theme.ink
+    // A window of its own over the map, so it can't let the map shine through.
+    color: Theme.mapBackground
 
     Item {
         objectName: "SignalList_Obj"
@@ -75,12 +71,14 @@ Rectangle {
                     objectName: "backgroundButton"
                     text: qsTr("Hide window")
                     flat: true
+                    font.capitalization: Font.MixedCase
                     onClicked: signalList.gotoBackground()
                 }
                 Button {
                     objectName: "abortButton"
                     text: qsTr("Stop export")
                     flat: true
+                    font.capitalization: Font.MixedCase
                     onClicked: signalList.abortProgress()
                 }
             }

@@ -4,7 +4,8 @@ import QtQuick 2.15
 // Colours, spacing and type of the whole interface. The map is the stage: panels
 // float over it in a light, warm paper tone and stay small.
 QtObject {
-    // Palette
+    // Palette; accent, ink and paper are also the Material colours of
+    // qtquickcontrols2.conf.
     readonly property color ink: "#1F2A30"
     readonly property color inkMuted: "#5E6A71"
     readonly property color paper: "#FBFAF7"
@@ -13,8 +14,9 @@ QtObject {
     readonly property color accent: "#C4553B"
     readonly property color accentInk: "#FFFFFF"
     readonly property color danger: "#B3261E"
-    readonly property color scrim: "#661F2A30"
-    readonly property color mapBackground: "#D7E3E6"
+    readonly property color scrim: "#401F2A30"
+    readonly property color mapBackground: "#DCE6E8"
+    readonly property color gridLine: "#C2D1D5"
 
     // Spacing scale, in pixels
     readonly property int spaceXS: 4

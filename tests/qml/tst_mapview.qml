@@ -133,7 +133,7 @@ Item {
             compare(actionSpy.count, 0)
 
             host.showError("Broken file")
-            tryCompare(waitBox, "visible", false)
+            compare(waitBox.visible, false)
             tryCompare(error, "opened", true)
             compare(find(view, "errorText").text, "Broken file")
             press("closeErrorButton")
