@@ -30,7 +30,7 @@ fuzz: deps
 	fuzz/run-all fuzz-build $(FUZZ_SECONDS)
 
 run: build
-	$(BUILD)/bin/tourlet-cli $(ARGS)
+	$(BUILD)/bin/tourlet $(ARGS)
 
 clean:
 	rm -rf $(BUILD) $(BUILD)-bench fuzz-build

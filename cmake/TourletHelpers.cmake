@@ -1,11 +1,15 @@
 # tourlet_add_test(NAME <name> SOURCES <files...> [LIBS <targets...>] [WINDOW])
 # Builds one Qt Test executable and registers it with CTest. WINDOW tests need an
-# OpenGL surface and run under xvfb-run; the others use the offscreen platform.
+# OpenGL surface, link the window library and run under xvfb-run; the others use the
+# offscreen platform.
 function(tourlet_add_test)
   cmake_parse_arguments(T "WINDOW" "NAME" "SOURCES;LIBS" ${ARGN})
   find_package(Qt5 REQUIRED COMPONENTS Test)
   add_executable(${T_NAME} ${T_SOURCES})
   target_link_libraries(${T_NAME} PRIVATE tourlet_core Qt5::Test ${T_LIBS})
+  if(T_WINDOW)
+    target_link_libraries(${T_NAME} PRIVATE tourlet_window)
+  endif()
   target_include_directories(${T_NAME} PRIVATE ${PROJECT_SOURCE_DIR}/tests/common)
   target_compile_definitions(${T_NAME} PRIVATE TOURLET_TEST_DATA="${CMAKE_CURRENT_SOURCE_DIR}/data")
   if(T_WINDOW)

@@ -4,6 +4,7 @@
 #include "models/AltitudePreset.h"
 #include "models/PhotoPool.h"
 #include "path/PathManager.h"
+#include "project/ExportProperties.h"
 #include "project/ProjectFields.h"
 #include "project/ProjectLoadResult.h"
 #include "project/QProjectController.h"
@@ -69,6 +70,16 @@ public:
     // "MaxAnimationDuration" of the settings.
     void setMaxAnimationDuration(uint32_t index) { m_timing.maxDurationIndex = index; }
 
+    // The window's scale: 1.0, or 2.0 on a high-density screen. Set once at start.
+    double scale() const { return m_scale; }
+    void setScale(double scale) { m_scale = scale; }
+    // The program's version as four dot-separated numbers. Set once at start.
+    QString programVersion() const { return m_programVersion; }
+    void setProgramVersion(const QString &version) { m_programVersion = version; }
+
+    ExportProperties &exportProperties() { return m_exportProperties; }
+    const ExportProperties &exportProperties() const { return m_exportProperties; }
+
     // Set while the open document is a track whose key points may not be edited freely.
     bool keyPointsFixed() const { return m_keyPointsFixed; }
     void setKeyPointsFixed(bool on) { m_keyPointsFixed = on; }
@@ -84,4 +95,7 @@ private:
     QProjectController m_projectController;
     uint32_t m_gpxAliasing = 1;
     bool m_keyPointsFixed = false;
+    double m_scale = 1.0;
+    QString m_programVersion = QStringLiteral("0.0.0.0");
+    ExportProperties m_exportProperties;
 };

@@ -1,0 +1,142 @@
+import QtQuick 2.15
+import QtQuick.Controls 2.15
+import "../Theme"
+import "SignalLists"
+
+// The program's window: the map owns it, the project commands float over it, and
+// the dialogs of the map view come up in front of both.
+Item {
+    id: root
+
+    width: host.windowSize && host.windowSize.width > 0 ? host.windowSize.width : 1280
+    height: host.windowSize && host.windowSize.height > 0 ? host.windowSize.height : 800
+
+    readonly property var actions: host.messageBoxAction
+    readonly property bool modalOpen: messageBox.visible || hintBox.visible
+                                      || errorBox.visible || waitState.visible
+
+    // The id of a message-box action by name; "actionNone" for a name the table lacks.
+    function action(name) {
+        return actions[name] !== undefined ? actions[name] : actions["actionNone"]
+    }
+
+    // New, open and open track: a modified project is only left after asking.
+    function runProjectCommand(plainAction, saveFirstAction) {
+        if (host.projectModified)
+            messageBox.ask(qsTr("This project has changes that are not saved yet. Save them first?"),
+                           action(plainAction), action(saveFirstAction), action("actionNone"))
+        else
+            signalList.triggerMessageBoxAction(action(plainAction))
+    }
+
+    // The native side takes its texts from here, again after each change of language.
+    function sendHostStrings() {
+        host.strHostStrings = hostStrings.table()
+        toolBar.languages = host.languageCBEntries
+    }
+
+    Component.onCompleted: {
+        if (host.getStrings)
+            sendHostStrings()
+    }
+
+    HostStrings {
+        id: hostStrings
+    }
+
+    SignalList {
+        id: signalList
+    }
+    PhotoPoolSignalList {}
+    AltitudePresetsSignalList {}
+    KeyPointItemsSignalList {}
+    KeyPointImageItemsSignalList {}
+    PilotItemsSignalList {}
+    TrackingList {}
+    BackgroundChooserSignalList {}
+    ExportSignalList {}
+
+    WorldMap {
+        id: worldMap
+        anchors.fill: parent
+        locationSettings: host.locationSettings
+        onViewMoved: {
+            signalList.setCenterPosition(center.latitude, center.longitude)
+            signalList.saveBoundaries(topLeft.longitude, topLeft.latitude,
+                                      bottomRight.longitude, bottomRight.latitude)
+            signalList.setMoveDistance(hitRadius)
+            if (typeof host.setZoom === "function")
+                host.setZoom(zoomLevel)
+        }
+    }
+
+    ProjectToolBar {
+        id: toolBar
+        anchors.left: parent.left
+        anchors.top: parent.top
+        anchors.margins: Theme.spaceL
+        title: host.title !== undefined ? host.title : ""
+        commandsEnabled: !root.modalOpen
+        onNewProjectRequested: root.runProjectCommand("actionNewProject", "actionSaveAndNewProject")
+        onOpenProjectRequested: root.runProjectCommand("actionLoadProject", "actionSaveAndLoadProject")
+        onOpenTrackRequested: root.runProjectCommand("actionLoadGPX", "actionSaveAndLoadGPX")
+        onSaveRequested: signalList.saveProject()
+        onExportGpxRequested: host.exportGPX()
+        onLanguageChosen: signalList.setLanguage(index)
+        onFullScreenRequested: host.toggleFullScreen()
+    }
+
+    // Quitting asks about unsaved changes as closing the window does.
+    Shortcut {
+        sequence: StandardKey.Quit
+        enabled: !root.modalOpen
+        onActivated: host.handleCloseApp()
+    }
+
+    MessageBox {
+        id: messageBox
+        objectName: "messageBox"
+        actions: root.actions
+        onActionChosen: signalList.triggerMessageBoxAction(actionId)
+    }
+
+    HintBox {
+        id: hintBox
+        objectName: "hintBox"
+        onActionChosen: signalList.triggerMessageBoxAction(actionId)
+    }
+
+    ErrorBox {
+        id: errorBox
+        objectName: "errorBox"
+    }
+
+    WaitState {
+        id: waitState
+        objectName: "waitState"
+    }
+
+    Connections {
+        target: host
+        function onShowMessageBox(text, actionContinue, actionAbort, actionClose) {
+            messageBox.ask(text, actionContinue, actionAbort, actionClose)
+        }
+        function onShowHint(text, actionConfirmed) {
+            hintBox.show(text, actionConfirmed)
+        }
+        // A load that fails leaves its wait state up: the error takes its place.
+        function onShowError(text) {
+            waitState.close()
+            errorBox.show(text)
+        }
+        function onShowWaitState(text) {
+            waitState.show(text)
+        }
+        function onHideWaitState() {
+            waitState.close()
+        }
+        function onLanguageCBEntriesChanged() {
+            root.sendHostStrings()
+        }
+    }
+}

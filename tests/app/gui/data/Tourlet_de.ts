@@ -1,0 +1,11 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="de">
+<context>
+    <name>Greeting</name>
+    <message>
+        <source>Hello</source>
+        <translation>Hallo</translation>
+    </message>
+</context>
+</TS>

@@ -1,0 +1,144 @@
+#include "TestFiles.h"
+
+#include "mapview/MapView.h"
+#include "project/PainterPathRenderer_Controller.h"
+
+#include <QQuickItem>
+#include <QResource>
+#include <QSettings>
+#include <QSignalSpy>
+#include <QWidget>
+#include <QtTest>
+
+// The map view with the program's own interface, in a real window.
+namespace {
+
+QStringList warnings;
+QtMessageHandler defaultHandler = nullptr;
+
+void collectWarnings(QtMsgType type, const QMessageLogContext &context, const QString &message)
+{
+    if (type != QtDebugMsg && type != QtInfoMsg)
+        warnings.append(message);
+    if (type != QtDebugMsg)
+        defaultHandler(type, context, message);
+}
+
+const QByteArray ride = "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
+                        "<gpx version=\"1.1\" creator=\"test\" xmlns=\"http://www.topografix.com/GPX/1/1\"><trk><trkseg>\n"
+                        "<trkpt lat=\"47.370\" lon=\"8.540\"/><trkpt lat=\"47.380\" lon=\"8.550\"/>\n"
+                        "<trkpt lat=\"47.392\" lon=\"8.561\"/><trkpt lat=\"47.401\" lon=\"8.572\"/>\n"
+                        "</trkseg></trk></gpx>\n";
+
+} // namespace
+
+class tst_MapWindow : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase();
+    void cleanup();
+    void cleanupTestCase();
+
+    void interfaceHandsOverItsStrings();
+    void trackOpensOnTheMap();
+    void failedLoadShowsTheErrorBox();
+
+private:
+    // A popup of the interface is up.
+    bool shown(const char *name) const
+    {
+        const QObject *popup = m_view->rootObject()->findChild<QObject *>(name);
+        return popup && popup->property("visible").toBool();
+    }
+    bool waitForLoad()
+    {
+        QSignalSpy done(m_view.get(), &MapView::hideWaitState);
+        return done.wait(10000);
+    }
+
+    QTemporaryDir m_dir;
+    std::unique_ptr<QSettings> m_store;
+    PainterPathRenderer_Controller m_document;
+    QWidget m_window;
+    std::unique_ptr<MapView> m_view;
+};
+
+void tst_MapWindow::initTestCase()
+{
+    QVERIFY(QResource::registerResource(QStringLiteral(TOURLET_RESOURCE)));
+    QCoreApplication::setApplicationName(QStringLiteral("Tourlet"));
+    defaultHandler = qInstallMessageHandler(collectWarnings);
+
+    m_store = std::make_unique<QSettings>(m_dir.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat);
+    m_view = std::make_unique<MapView>(&m_document, nullptr, AppSettings(*m_store));
+    m_window.resize(1072, 603);
+    m_view->init(&m_window, false);
+    m_window.show();
+    QVERIFY(QTest::qWaitForWindowExposed(&m_window));
+    QVERIFY(m_view->rootObject());
+
+    // The connect of setPathSettings fails on purpose: its two lines are the only
+    // warnings the start may give.
+    QCOMPARE(warnings.size(), 2);
+    QVERIFY(warnings[0].contains(QLatin1String("No such slot MapView::setPathSettings(QVariant)")));
+    QVERIFY(warnings[1].contains(QLatin1String("'SignalList_Obj'")));
+    warnings.clear();
+}
+
+void tst_MapWindow::cleanup()
+{
+    QVERIFY2(warnings.isEmpty(), qPrintable(warnings.join(QLatin1Char('\n'))));
+}
+
+void tst_MapWindow::cleanupTestCase()
+{
+    m_view.reset();
+    qInstallMessageHandler(defaultHandler);
+}
+
+void tst_MapWindow::interfaceHandsOverItsStrings()
+{
+    QVERIFY(!m_view->strHostStrings().isEmpty());
+    const QVariantList languages = m_view->languageCBEntries();
+    QCOMPARE(languages.size(), 7);
+    int selected = 0;
+    for (const QVariant &entry : languages) {
+        QVERIFY(!entry.toMap().value("title").toString().startsWith(QLatin1String("str")));
+        selected += entry.toMap().value("selected").toInt();
+    }
+    QCOMPARE(selected, 1);
+    QCOMPARE(m_window.windowTitle(), QStringLiteral("Tourlet"));
+}
+
+void tst_MapWindow::trackOpensOnTheMap()
+{
+    const QString track = writeTestFile(m_dir, QStringLiteral("zurich.gpx"), ride);
+    m_view->openFile(track);
+    QTRY_VERIFY(shown("waitState"));
+    QVERIFY(waitForLoad());
+
+    QTRY_VERIFY(!shown("waitState"));
+    QCOMPARE(m_window.windowTitle(), QStringLiteral("Tourlet - zurich.gpx"));
+    QObject *map = m_view->rootObject()->findChild<QObject *>("worldMap");
+    QVERIFY(map);
+    QTRY_COMPARE(map->property("zoomLevel").toDouble(), m_view->currentZoomLevel());
+    QVERIFY(m_view->currentZoomLevel() > 10.0);
+}
+
+void tst_MapWindow::failedLoadShowsTheErrorBox()
+{
+    const QString junk = writeTestFile(m_dir, QStringLiteral("junk.zkgeo"), "neither a project nor a track\n");
+    QSignalSpy errors(m_view.get(), &MapView::showError);
+    m_view->openFile(junk);
+    QVERIFY(errors.wait(10000));
+
+    const QString text = errors.first().first().toString();
+    QVERIFY2(!text.isEmpty() && text != QLatin1String("strErrorCantLoadProject"), qPrintable(text));
+    QTRY_VERIFY(shown("errorBox"));
+    QVERIFY(!shown("waitState"));
+}
+
+QTEST_MAIN(tst_MapWindow)
+#include "tst_mapwindow.moc"

@@ -1,0 +1,39 @@
+import QtQuick 2.15
+
+// Stands in for the map view: the properties, slots and signals the interface uses,
+// with counters where the tests need to see a call.
+QtObject {
+    property size windowSize: Qt.size(1280, 800)
+    property string title: "Tourlet"
+    property bool projectModified: false
+    property bool getStrings: true
+    property real exportPosition: 0.5
+    property var locationSettings: ({ "centerLongitude": 11.58, "centerLatitude": 48.14,
+                                      "zoomLevel": 6, "bearing": 0, "tilt": 0 })
+    property var messageBoxAction: ({ "actionNone": -1, "actionNewProject": 1000,
+                                      "actionLoadProject": 1001, "actionLoadGPX": 1002,
+                                      "actionCloseApp": 1003, "actionSaveAndCloseProject": 1004,
+                                      "actionSendVideo": 1006, "actionSaveAndNewProject": 1007,
+                                      "actionSaveAndLoadProject": 1008, "actionSaveAndLoadGPX": 1009,
+                                      "actionShowTutorial": 1012, "actionDeleteUserAvatar": 1013,
+                                      "actionOpenWindowsSettings": 1014 })
+    property var languageCBEntries: [{ "title": "strDEde", "selected": 0 },
+                                     { "title": "strENen", "selected": 1 }]
+
+    property var strHostStrings: ({})
+    property int stringWrites: 0
+    onStrHostStringsChanged: ++stringWrites
+
+    property int fullScreenToggles: 0
+    property int gpxExports: 0
+    property real zoomReported: -1
+    function toggleFullScreen() { ++fullScreenToggles }
+    function exportGPX() { ++gpxExports }
+    function setZoom(level) { zoomReported = level }
+
+    signal showMessageBox(string text, int actionContinue, int actionAbort, int actionClose)
+    signal showHint(string text, int actionConfirmed)
+    signal showError(string text)
+    signal showWaitState(string text)
+    signal hideWaitState()
+}

@@ -1,0 +1,366 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="de_DE">
+<context>
+    <name>ErrorBox</name>
+    <message>
+        <source>Something went wrong</source>
+        <translation>Etwas ist schiefgegangen</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>Graticule</name>
+    <message>
+        <source>%1 N</source>
+        <extracomment>Latitude north of the equator; %1 is the angle, such as 51°12′</extracomment>
+        <translation>%1 N</translation>
+    </message>
+    <message>
+        <source>%1 S</source>
+        <extracomment>Latitude south of the equator; %1 is the angle, such as 51°12′</extracomment>
+        <translation>%1 S</translation>
+    </message>
+    <message>
+        <source>%1 E</source>
+        <extracomment>Longitude east of Greenwich; %1 is the angle, such as 13°30′</extracomment>
+        <translation>%1 O</translation>
+    </message>
+    <message>
+        <source>%1 W</source>
+        <extracomment>Longitude west of Greenwich; %1 is the angle, such as 13°30′</extracomment>
+        <translation>%1 W</translation>
+    </message>
+</context>
+<context>
+    <name>HintBox</name>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>HostStrings</name>
+    <message>
+        <source>All animations</source>
+        <translation>Alle Animationen</translation>
+    </message>
+    <message>
+        <source>All archives</source>
+        <translation>Alle Archive</translation>
+    </message>
+    <message>
+        <source>All pictures</source>
+        <translation>Alle Bilder</translation>
+    </message>
+    <message>
+        <source>All supported files</source>
+        <translation>Alle unterstützten Dateien</translation>
+    </message>
+    <message>
+        <source>Choose a map or picture of your own</source>
+        <translation>Eigene Karte oder eigenes Bild wählen</translation>
+    </message>
+    <message>
+        <source>Save the film as</source>
+        <translation>Film speichern unter</translation>
+    </message>
+    <message>
+        <source>Deutsch</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Deutsch</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <extracomment>Title of a new waypoint, followed by its number</extracomment>
+        <translation>Wegpunkt</translation>
+    </message>
+    <message>
+        <source>English</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>English</translation>
+    </message>
+    <message>
+        <source>Español</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Español</translation>
+    </message>
+    <message>
+        <source>The route could not be saved as a GPX file.</source>
+        <translation>Die Route konnte nicht als GPX-Datei gespeichert werden.</translation>
+    </message>
+    <message>
+        <source>This file could not be opened. It is neither a project nor a track that Tourlet can read.</source>
+        <translation>Diese Datei konnte nicht geöffnet werden. Sie ist weder ein Projekt noch ein Track, den Tourlet lesen kann.</translation>
+    </message>
+    <message>
+        <source>There is not enough memory to finish this.</source>
+        <translation>Der Arbeitsspeicher reicht nicht aus, um dies abzuschließen.</translation>
+    </message>
+    <message>
+        <source>The file could not be opened.</source>
+        <translation>Die Datei konnte nicht geöffnet werden.</translation>
+    </message>
+    <message>
+        <source>The file is damaged or built in a way that Tourlet does not know.</source>
+        <translation>Die Datei ist beschädigt oder auf eine Weise aufgebaut, die Tourlet nicht kennt.</translation>
+    </message>
+    <message>
+        <source>The video components that the export needs are missing on this computer.</source>
+        <translation>Auf diesem Computer fehlen die Videokomponenten, die der Export benötigt.</translation>
+    </message>
+    <message>
+        <source>The film could not be exported.</source>
+        <translation>Der Film konnte nicht exportiert werden.</translation>
+    </message>
+    <message>
+        <source>MP4 video (H.264)</source>
+        <translation>MP4-Video (H.264)</translation>
+    </message>
+    <message>
+        <source>WMV video</source>
+        <translation>WMV-Video</translation>
+    </message>
+    <message>
+        <source>4K (3840 × 2160)</source>
+        <translation>4K (3840 × 2160)</translation>
+    </message>
+    <message>
+        <source>Size of the window</source>
+        <translation>Fenstergröße</translation>
+    </message>
+    <message>
+        <source>Full HD (1920 × 1080)</source>
+        <translation>Full HD (1920 × 1080)</translation>
+    </message>
+    <message>
+        <source>Français</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Français</translation>
+    </message>
+    <message>
+        <source>Date of the file</source>
+        <translation>Dateidatum</translation>
+    </message>
+    <message>
+        <source>File name</source>
+        <translation>Dateiname</translation>
+    </message>
+    <message>
+        <source>Automatic</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Automatisch</translation>
+    </message>
+    <message>
+        <source>Standard</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Standard</translation>
+    </message>
+    <message>
+        <source>Strong</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Stark</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Aus</translation>
+    </message>
+    <message>
+        <source>Italiano</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Italiano</translation>
+    </message>
+    <message>
+        <source>日本語</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>日本語</translation>
+    </message>
+    <message>
+        <source>Open altitude theme</source>
+        <translation>Höhenprofil-Vorlage öffnen</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Öffnen</translation>
+    </message>
+    <message>
+        <source>Loading</source>
+        <extracomment>Shown while a file loads, followed by the share done in percent</extracomment>
+        <translation>Wird geladen</translation>
+    </message>
+    <message>
+        <source>10 minutes</source>
+        <translation>10 Minuten</translation>
+    </message>
+    <message>
+        <source>1 minute</source>
+        <translation>1 Minute</translation>
+    </message>
+    <message>
+        <source>30 minutes</source>
+        <translation>30 Minuten</translation>
+    </message>
+    <message>
+        <source>5 minutes</source>
+        <translation>5 Minuten</translation>
+    </message>
+    <message>
+        <source>60 minutes</source>
+        <translation>60 Minuten</translation>
+    </message>
+    <message>
+        <source>Date taken</source>
+        <extracomment>Sort photos by the date stored in the photo by the camera</extracomment>
+        <translation>Aufnahmedatum</translation>
+    </message>
+    <message>
+        <source>Nederlands</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Nederlands</translation>
+    </message>
+    <message>
+        <source>Tourlet projects</source>
+        <translation>Tourlet-Projekte</translation>
+    </message>
+    <message>
+        <source>This project has changes that are not saved yet. Save them before Tourlet closes?</source>
+        <translation>Dieses Projekt enthält Änderungen, die noch nicht gespeichert sind. Sollen sie gespeichert werden, bevor Tourlet beendet wird?</translation>
+    </message>
+    <message>
+        <source>Save altitude theme</source>
+        <translation>Höhenprofil-Vorlage speichern</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Speichern</translation>
+    </message>
+    <message>
+        <source>Choose photos</source>
+        <translation>Fotos auswählen</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <extracomment>Change between photos: straight cut</extracomment>
+        <translation>Schnitt</translation>
+    </message>
+    <message>
+        <source>Fade</source>
+        <extracomment>Change between photos: cross-fade</extracomment>
+        <translation>Überblenden</translation>
+    </message>
+    <message>
+        <source>Turn</source>
+        <extracomment>Change between photos: the next photo turns in</extracomment>
+        <translation>Drehen</translation>
+    </message>
+    <message>
+        <source>Zoom</source>
+        <extracomment>Change between photos: the next photo grows from the centre</extracomment>
+        <translation>Zoom</translation>
+    </message>
+</context>
+<context>
+    <name>MapView</name>
+    <message>
+        <source>This project has changes that are not saved yet. Save them first?</source>
+        <translation>Dieses Projekt enthält Änderungen, die noch nicht gespeichert sind. Zuerst speichern?</translation>
+    </message>
+</context>
+<context>
+    <name>MessageBox</name>
+    <message>
+        <source>Save</source>
+        <translation>Speichern</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+    <message>
+        <source>Don&apos;t save</source>
+        <translation>Nicht speichern</translation>
+    </message>
+    <message>
+        <source>Send the film</source>
+        <translation>Film senden</translation>
+    </message>
+    <message>
+        <source>Show the tutorial</source>
+        <translation>Einführung zeigen</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Löschen</translation>
+    </message>
+    <message>
+        <source>Open the system settings</source>
+        <translation>Systemeinstellungen öffnen</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>ProgressView</name>
+    <message>
+        <source>Exporting the film</source>
+        <translation>Film wird exportiert</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>Share of the film exported so far</extracomment>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Hide window</source>
+        <translation>Fenster ausblenden</translation>
+    </message>
+    <message>
+        <source>Stop export</source>
+        <translation>Export abbrechen</translation>
+    </message>
+</context>
+<context>
+    <name>ProjectToolBar</name>
+    <message>
+        <source>New project</source>
+        <translation>Neues Projekt</translation>
+    </message>
+    <message>
+        <source>Open project</source>
+        <translation>Projekt öffnen</translation>
+    </message>
+    <message>
+        <source>Open track</source>
+        <translation>Track öffnen</translation>
+    </message>
+    <message>
+        <source>Save project</source>
+        <translation>Projekt speichern</translation>
+    </message>
+    <message>
+        <source>Export route as GPX</source>
+        <translation>Route als GPX exportieren</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Sprache</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Vollbild</translation>
+    </message>
+</context>
+<context>
+    <name>ToolBarButton</name>
+    <message>
+        <source>%1 (%2)</source>
+        <translation>%1 (%2)</translation>
+    </message>
+</context>
+</TS>

@@ -1,0 +1,366 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="en_US">
+<context>
+    <name>ErrorBox</name>
+    <message>
+        <source>Something went wrong</source>
+        <translation>Something went wrong</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>Graticule</name>
+    <message>
+        <source>%1 N</source>
+        <extracomment>Latitude north of the equator; %1 is the angle, such as 51°12′</extracomment>
+        <translation>%1 N</translation>
+    </message>
+    <message>
+        <source>%1 S</source>
+        <extracomment>Latitude south of the equator; %1 is the angle, such as 51°12′</extracomment>
+        <translation>%1 S</translation>
+    </message>
+    <message>
+        <source>%1 E</source>
+        <extracomment>Longitude east of Greenwich; %1 is the angle, such as 13°30′</extracomment>
+        <translation>%1 E</translation>
+    </message>
+    <message>
+        <source>%1 W</source>
+        <extracomment>Longitude west of Greenwich; %1 is the angle, such as 13°30′</extracomment>
+        <translation>%1 W</translation>
+    </message>
+</context>
+<context>
+    <name>HintBox</name>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>HostStrings</name>
+    <message>
+        <source>All animations</source>
+        <translation>All animations</translation>
+    </message>
+    <message>
+        <source>All archives</source>
+        <translation>All archives</translation>
+    </message>
+    <message>
+        <source>All pictures</source>
+        <translation>All pictures</translation>
+    </message>
+    <message>
+        <source>All supported files</source>
+        <translation>All supported files</translation>
+    </message>
+    <message>
+        <source>Choose a map or picture of your own</source>
+        <translation>Choose a map or picture of your own</translation>
+    </message>
+    <message>
+        <source>Save the film as</source>
+        <translation>Save the film as</translation>
+    </message>
+    <message>
+        <source>Deutsch</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Deutsch</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <extracomment>Title of a new waypoint, followed by its number</extracomment>
+        <translation>Waypoint</translation>
+    </message>
+    <message>
+        <source>English</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>English</translation>
+    </message>
+    <message>
+        <source>Español</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Español</translation>
+    </message>
+    <message>
+        <source>The route could not be saved as a GPX file.</source>
+        <translation>The route could not be saved as a GPX file.</translation>
+    </message>
+    <message>
+        <source>This file could not be opened. It is neither a project nor a track that Tourlet can read.</source>
+        <translation>This file could not be opened. It is neither a project nor a track that Tourlet can read.</translation>
+    </message>
+    <message>
+        <source>There is not enough memory to finish this.</source>
+        <translation>There is not enough memory to finish this.</translation>
+    </message>
+    <message>
+        <source>The file could not be opened.</source>
+        <translation>The file could not be opened.</translation>
+    </message>
+    <message>
+        <source>The file is damaged or built in a way that Tourlet does not know.</source>
+        <translation>The file is damaged or built in a way that Tourlet does not know.</translation>
+    </message>
+    <message>
+        <source>The video components that the export needs are missing on this computer.</source>
+        <translation>The video components that the export needs are missing on this computer.</translation>
+    </message>
+    <message>
+        <source>The film could not be exported.</source>
+        <translation>The film could not be exported.</translation>
+    </message>
+    <message>
+        <source>MP4 video (H.264)</source>
+        <translation>MP4 video (H.264)</translation>
+    </message>
+    <message>
+        <source>WMV video</source>
+        <translation>WMV video</translation>
+    </message>
+    <message>
+        <source>4K (3840 × 2160)</source>
+        <translation>4K (3840 × 2160)</translation>
+    </message>
+    <message>
+        <source>Size of the window</source>
+        <translation>Size of the window</translation>
+    </message>
+    <message>
+        <source>Full HD (1920 × 1080)</source>
+        <translation>Full HD (1920 × 1080)</translation>
+    </message>
+    <message>
+        <source>Français</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Français</translation>
+    </message>
+    <message>
+        <source>Date of the file</source>
+        <translation>Date of the file</translation>
+    </message>
+    <message>
+        <source>File name</source>
+        <translation>File name</translation>
+    </message>
+    <message>
+        <source>Automatic</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Automatic</translation>
+    </message>
+    <message>
+        <source>Standard</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Standard</translation>
+    </message>
+    <message>
+        <source>Strong</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Strong</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Off</translation>
+    </message>
+    <message>
+        <source>Italiano</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Italiano</translation>
+    </message>
+    <message>
+        <source>日本語</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>日本語</translation>
+    </message>
+    <message>
+        <source>Open altitude theme</source>
+        <translation>Open altitude theme</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Open</translation>
+    </message>
+    <message>
+        <source>Loading</source>
+        <extracomment>Shown while a file loads, followed by the share done in percent</extracomment>
+        <translation>Loading</translation>
+    </message>
+    <message>
+        <source>10 minutes</source>
+        <translation>10 minutes</translation>
+    </message>
+    <message>
+        <source>1 minute</source>
+        <translation>1 minute</translation>
+    </message>
+    <message>
+        <source>30 minutes</source>
+        <translation>30 minutes</translation>
+    </message>
+    <message>
+        <source>5 minutes</source>
+        <translation>5 minutes</translation>
+    </message>
+    <message>
+        <source>60 minutes</source>
+        <translation>60 minutes</translation>
+    </message>
+    <message>
+        <source>Date taken</source>
+        <extracomment>Sort photos by the date stored in the photo by the camera</extracomment>
+        <translation>Date taken</translation>
+    </message>
+    <message>
+        <source>Nederlands</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Nederlands</translation>
+    </message>
+    <message>
+        <source>Tourlet projects</source>
+        <translation>Tourlet projects</translation>
+    </message>
+    <message>
+        <source>This project has changes that are not saved yet. Save them before Tourlet closes?</source>
+        <translation>This project has changes that are not saved yet. Save them before Tourlet closes?</translation>
+    </message>
+    <message>
+        <source>Save altitude theme</source>
+        <translation>Save altitude theme</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Save</translation>
+    </message>
+    <message>
+        <source>Choose photos</source>
+        <translation>Choose photos</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <extracomment>Change between photos: straight cut</extracomment>
+        <translation>Cut</translation>
+    </message>
+    <message>
+        <source>Fade</source>
+        <extracomment>Change between photos: cross-fade</extracomment>
+        <translation>Fade</translation>
+    </message>
+    <message>
+        <source>Turn</source>
+        <extracomment>Change between photos: the next photo turns in</extracomment>
+        <translation>Turn</translation>
+    </message>
+    <message>
+        <source>Zoom</source>
+        <extracomment>Change between photos: the next photo grows from the centre</extracomment>
+        <translation>Zoom</translation>
+    </message>
+</context>
+<context>
+    <name>MapView</name>
+    <message>
+        <source>This project has changes that are not saved yet. Save them first?</source>
+        <translation>This project has changes that are not saved yet. Save them first?</translation>
+    </message>
+</context>
+<context>
+    <name>MessageBox</name>
+    <message>
+        <source>Save</source>
+        <translation>Save</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancel</translation>
+    </message>
+    <message>
+        <source>Don&apos;t save</source>
+        <translation>Don&apos;t save</translation>
+    </message>
+    <message>
+        <source>Send the film</source>
+        <translation>Send the film</translation>
+    </message>
+    <message>
+        <source>Show the tutorial</source>
+        <translation>Show the tutorial</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
+    </message>
+    <message>
+        <source>Open the system settings</source>
+        <translation>Open the system settings</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>ProgressView</name>
+    <message>
+        <source>Exporting the film</source>
+        <translation>Exporting the film</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>Share of the film exported so far</extracomment>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Hide window</source>
+        <translation>Hide window</translation>
+    </message>
+    <message>
+        <source>Stop export</source>
+        <translation>Stop export</translation>
+    </message>
+</context>
+<context>
+    <name>ProjectToolBar</name>
+    <message>
+        <source>New project</source>
+        <translation>New project</translation>
+    </message>
+    <message>
+        <source>Open project</source>
+        <translation>Open project</translation>
+    </message>
+    <message>
+        <source>Open track</source>
+        <translation>Open track</translation>
+    </message>
+    <message>
+        <source>Save project</source>
+        <translation>Save project</translation>
+    </message>
+    <message>
+        <source>Export route as GPX</source>
+        <translation>Export route as GPX</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Language</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Full screen</translation>
+    </message>
+</context>
+<context>
+    <name>ToolBarButton</name>
+    <message>
+        <source>%1 (%2)</source>
+        <translation>%1 (%2)</translation>
+    </message>
+</context>
+</TS>

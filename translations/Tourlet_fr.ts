@@ -1,0 +1,366 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="fr_FR">
+<context>
+    <name>ErrorBox</name>
+    <message>
+        <source>Something went wrong</source>
+        <translation>Une erreur est survenue</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>Graticule</name>
+    <message>
+        <source>%1 N</source>
+        <extracomment>Latitude north of the equator; %1 is the angle, such as 51°12′</extracomment>
+        <translation>%1 N</translation>
+    </message>
+    <message>
+        <source>%1 S</source>
+        <extracomment>Latitude south of the equator; %1 is the angle, such as 51°12′</extracomment>
+        <translation>%1 S</translation>
+    </message>
+    <message>
+        <source>%1 E</source>
+        <extracomment>Longitude east of Greenwich; %1 is the angle, such as 13°30′</extracomment>
+        <translation>%1 E</translation>
+    </message>
+    <message>
+        <source>%1 W</source>
+        <extracomment>Longitude west of Greenwich; %1 is the angle, such as 13°30′</extracomment>
+        <translation>%1 O</translation>
+    </message>
+</context>
+<context>
+    <name>HintBox</name>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>HostStrings</name>
+    <message>
+        <source>All animations</source>
+        <translation>Toutes les animations</translation>
+    </message>
+    <message>
+        <source>All archives</source>
+        <translation>Toutes les archives</translation>
+    </message>
+    <message>
+        <source>All pictures</source>
+        <translation>Toutes les images</translation>
+    </message>
+    <message>
+        <source>All supported files</source>
+        <translation>Tous les fichiers pris en charge</translation>
+    </message>
+    <message>
+        <source>Choose a map or picture of your own</source>
+        <translation>Choisir votre propre carte ou image</translation>
+    </message>
+    <message>
+        <source>Save the film as</source>
+        <translation>Enregistrer le film sous</translation>
+    </message>
+    <message>
+        <source>Deutsch</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Deutsch</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <extracomment>Title of a new waypoint, followed by its number</extracomment>
+        <translation>Étape</translation>
+    </message>
+    <message>
+        <source>English</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>English</translation>
+    </message>
+    <message>
+        <source>Español</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Español</translation>
+    </message>
+    <message>
+        <source>The route could not be saved as a GPX file.</source>
+        <translation>L&apos;itinéraire n&apos;a pas pu être enregistré en fichier GPX.</translation>
+    </message>
+    <message>
+        <source>This file could not be opened. It is neither a project nor a track that Tourlet can read.</source>
+        <translation>Ce fichier n&apos;a pas pu être ouvert. Ce n&apos;est ni un projet ni une trace que Tourlet sait lire.</translation>
+    </message>
+    <message>
+        <source>There is not enough memory to finish this.</source>
+        <translation>La mémoire est insuffisante pour terminer cette opération.</translation>
+    </message>
+    <message>
+        <source>The file could not be opened.</source>
+        <translation>Le fichier n&apos;a pas pu être ouvert.</translation>
+    </message>
+    <message>
+        <source>The file is damaged or built in a way that Tourlet does not know.</source>
+        <translation>Le fichier est endommagé ou sa structure est inconnue de Tourlet.</translation>
+    </message>
+    <message>
+        <source>The video components that the export needs are missing on this computer.</source>
+        <translation>Les composants vidéo nécessaires à l&apos;exportation manquent sur cet ordinateur.</translation>
+    </message>
+    <message>
+        <source>The film could not be exported.</source>
+        <translation>Le film n&apos;a pas pu être exporté.</translation>
+    </message>
+    <message>
+        <source>MP4 video (H.264)</source>
+        <translation>Vidéo MP4 (H.264)</translation>
+    </message>
+    <message>
+        <source>WMV video</source>
+        <translation>Vidéo WMV</translation>
+    </message>
+    <message>
+        <source>4K (3840 × 2160)</source>
+        <translation>4K (3840 × 2160)</translation>
+    </message>
+    <message>
+        <source>Size of the window</source>
+        <translation>Taille de la fenêtre</translation>
+    </message>
+    <message>
+        <source>Full HD (1920 × 1080)</source>
+        <translation>Full HD (1920 × 1080)</translation>
+    </message>
+    <message>
+        <source>Français</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Français</translation>
+    </message>
+    <message>
+        <source>Date of the file</source>
+        <translation>Date du fichier</translation>
+    </message>
+    <message>
+        <source>File name</source>
+        <translation>Nom du fichier</translation>
+    </message>
+    <message>
+        <source>Automatic</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Automatique</translation>
+    </message>
+    <message>
+        <source>Standard</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Standard</translation>
+    </message>
+    <message>
+        <source>Strong</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Fort</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Désactivé</translation>
+    </message>
+    <message>
+        <source>Italiano</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Italiano</translation>
+    </message>
+    <message>
+        <source>日本語</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>日本語</translation>
+    </message>
+    <message>
+        <source>Open altitude theme</source>
+        <translation>Ouvrir un thème de profil altimétrique</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Ouvrir</translation>
+    </message>
+    <message>
+        <source>Loading</source>
+        <extracomment>Shown while a file loads, followed by the share done in percent</extracomment>
+        <translation>Chargement</translation>
+    </message>
+    <message>
+        <source>10 minutes</source>
+        <translation>10 minutes</translation>
+    </message>
+    <message>
+        <source>1 minute</source>
+        <translation>1 minute</translation>
+    </message>
+    <message>
+        <source>30 minutes</source>
+        <translation>30 minutes</translation>
+    </message>
+    <message>
+        <source>5 minutes</source>
+        <translation>5 minutes</translation>
+    </message>
+    <message>
+        <source>60 minutes</source>
+        <translation>60 minutes</translation>
+    </message>
+    <message>
+        <source>Date taken</source>
+        <extracomment>Sort photos by the date stored in the photo by the camera</extracomment>
+        <translation>Date de prise de vue</translation>
+    </message>
+    <message>
+        <source>Nederlands</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Nederlands</translation>
+    </message>
+    <message>
+        <source>Tourlet projects</source>
+        <translation>Projets Tourlet</translation>
+    </message>
+    <message>
+        <source>This project has changes that are not saved yet. Save them before Tourlet closes?</source>
+        <translation>Ce projet contient des modifications non enregistrées. Les enregistrer avant de fermer Tourlet ?</translation>
+    </message>
+    <message>
+        <source>Save altitude theme</source>
+        <translation>Enregistrer le thème de profil altimétrique</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Enregistrer</translation>
+    </message>
+    <message>
+        <source>Choose photos</source>
+        <translation>Choisir des photos</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <extracomment>Change between photos: straight cut</extracomment>
+        <translation>Coupe</translation>
+    </message>
+    <message>
+        <source>Fade</source>
+        <extracomment>Change between photos: cross-fade</extracomment>
+        <translation>Fondu</translation>
+    </message>
+    <message>
+        <source>Turn</source>
+        <extracomment>Change between photos: the next photo turns in</extracomment>
+        <translation>Rotation</translation>
+    </message>
+    <message>
+        <source>Zoom</source>
+        <extracomment>Change between photos: the next photo grows from the centre</extracomment>
+        <translation>Zoom</translation>
+    </message>
+</context>
+<context>
+    <name>MapView</name>
+    <message>
+        <source>This project has changes that are not saved yet. Save them first?</source>
+        <translation>Ce projet contient des modifications non enregistrées. Les enregistrer d&apos;abord ?</translation>
+    </message>
+</context>
+<context>
+    <name>MessageBox</name>
+    <message>
+        <source>Save</source>
+        <translation>Enregistrer</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+    <message>
+        <source>Don&apos;t save</source>
+        <translation>Ne pas enregistrer</translation>
+    </message>
+    <message>
+        <source>Send the film</source>
+        <translation>Envoyer le film</translation>
+    </message>
+    <message>
+        <source>Show the tutorial</source>
+        <translation>Afficher le tutoriel</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Supprimer</translation>
+    </message>
+    <message>
+        <source>Open the system settings</source>
+        <translation>Ouvrir les paramètres système</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>ProgressView</name>
+    <message>
+        <source>Exporting the film</source>
+        <translation>Exportation du film</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>Share of the film exported so far</extracomment>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Hide window</source>
+        <translation>Masquer la fenêtre</translation>
+    </message>
+    <message>
+        <source>Stop export</source>
+        <translation>Arrêter l&apos;exportation</translation>
+    </message>
+</context>
+<context>
+    <name>ProjectToolBar</name>
+    <message>
+        <source>New project</source>
+        <translation>Nouveau projet</translation>
+    </message>
+    <message>
+        <source>Open project</source>
+        <translation>Ouvrir un projet</translation>
+    </message>
+    <message>
+        <source>Open track</source>
+        <translation>Ouvrir une trace</translation>
+    </message>
+    <message>
+        <source>Save project</source>
+        <translation>Enregistrer le projet</translation>
+    </message>
+    <message>
+        <source>Export route as GPX</source>
+        <translation>Exporter l&apos;itinéraire en GPX</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Langue</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Plein écran</translation>
+    </message>
+</context>
+<context>
+    <name>ToolBarButton</name>
+    <message>
+        <source>%1 (%2)</source>
+        <translation>%1 (%2)</translation>
+    </message>
+</context>
+</TS>

@@ -1,0 +1,366 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="nl_NL">
+<context>
+    <name>ErrorBox</name>
+    <message>
+        <source>Something went wrong</source>
+        <translation>Er is iets misgegaan</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>Graticule</name>
+    <message>
+        <source>%1 N</source>
+        <extracomment>Latitude north of the equator; %1 is the angle, such as 51°12′</extracomment>
+        <translation>%1 N</translation>
+    </message>
+    <message>
+        <source>%1 S</source>
+        <extracomment>Latitude south of the equator; %1 is the angle, such as 51°12′</extracomment>
+        <translation>%1 Z</translation>
+    </message>
+    <message>
+        <source>%1 E</source>
+        <extracomment>Longitude east of Greenwich; %1 is the angle, such as 13°30′</extracomment>
+        <translation>%1 O</translation>
+    </message>
+    <message>
+        <source>%1 W</source>
+        <extracomment>Longitude west of Greenwich; %1 is the angle, such as 13°30′</extracomment>
+        <translation>%1 W</translation>
+    </message>
+</context>
+<context>
+    <name>HintBox</name>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>HostStrings</name>
+    <message>
+        <source>All animations</source>
+        <translation>Alle animaties</translation>
+    </message>
+    <message>
+        <source>All archives</source>
+        <translation>Alle archieven</translation>
+    </message>
+    <message>
+        <source>All pictures</source>
+        <translation>Alle afbeeldingen</translation>
+    </message>
+    <message>
+        <source>All supported files</source>
+        <translation>Alle ondersteunde bestanden</translation>
+    </message>
+    <message>
+        <source>Choose a map or picture of your own</source>
+        <translation>Eigen kaart of afbeelding kiezen</translation>
+    </message>
+    <message>
+        <source>Save the film as</source>
+        <translation>Film opslaan als</translation>
+    </message>
+    <message>
+        <source>Deutsch</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Deutsch</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <extracomment>Title of a new waypoint, followed by its number</extracomment>
+        <translation>Routepunt</translation>
+    </message>
+    <message>
+        <source>English</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>English</translation>
+    </message>
+    <message>
+        <source>Español</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Español</translation>
+    </message>
+    <message>
+        <source>The route could not be saved as a GPX file.</source>
+        <translation>De route kon niet als GPX-bestand worden opgeslagen.</translation>
+    </message>
+    <message>
+        <source>This file could not be opened. It is neither a project nor a track that Tourlet can read.</source>
+        <translation>Dit bestand kon niet worden geopend. Het is geen project en geen track die Tourlet kan lezen.</translation>
+    </message>
+    <message>
+        <source>There is not enough memory to finish this.</source>
+        <translation>Er is niet genoeg geheugen om dit af te ronden.</translation>
+    </message>
+    <message>
+        <source>The file could not be opened.</source>
+        <translation>Het bestand kon niet worden geopend.</translation>
+    </message>
+    <message>
+        <source>The file is damaged or built in a way that Tourlet does not know.</source>
+        <translation>Het bestand is beschadigd of op een manier opgebouwd die Tourlet niet kent.</translation>
+    </message>
+    <message>
+        <source>The video components that the export needs are missing on this computer.</source>
+        <translation>Op deze computer ontbreken de videocomponenten die voor de export nodig zijn.</translation>
+    </message>
+    <message>
+        <source>The film could not be exported.</source>
+        <translation>De film kon niet worden geëxporteerd.</translation>
+    </message>
+    <message>
+        <source>MP4 video (H.264)</source>
+        <translation>MP4-video (H.264)</translation>
+    </message>
+    <message>
+        <source>WMV video</source>
+        <translation>WMV-video</translation>
+    </message>
+    <message>
+        <source>4K (3840 × 2160)</source>
+        <translation>4K (3840 × 2160)</translation>
+    </message>
+    <message>
+        <source>Size of the window</source>
+        <translation>Venstergrootte</translation>
+    </message>
+    <message>
+        <source>Full HD (1920 × 1080)</source>
+        <translation>Full HD (1920 × 1080)</translation>
+    </message>
+    <message>
+        <source>Français</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Français</translation>
+    </message>
+    <message>
+        <source>Date of the file</source>
+        <translation>Bestandsdatum</translation>
+    </message>
+    <message>
+        <source>File name</source>
+        <translation>Bestandsnaam</translation>
+    </message>
+    <message>
+        <source>Automatic</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Automatisch</translation>
+    </message>
+    <message>
+        <source>Standard</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Standaard</translation>
+    </message>
+    <message>
+        <source>Strong</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Sterk</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <extracomment>Smoothing of recorded tracks</extracomment>
+        <translation>Uit</translation>
+    </message>
+    <message>
+        <source>Italiano</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Italiano</translation>
+    </message>
+    <message>
+        <source>日本語</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>日本語</translation>
+    </message>
+    <message>
+        <source>Open altitude theme</source>
+        <translation>Hoogteprofielthema openen</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Openen</translation>
+    </message>
+    <message>
+        <source>Loading</source>
+        <extracomment>Shown while a file loads, followed by the share done in percent</extracomment>
+        <translation>Bezig met laden</translation>
+    </message>
+    <message>
+        <source>10 minutes</source>
+        <translation>10 minuten</translation>
+    </message>
+    <message>
+        <source>1 minute</source>
+        <translation>1 minuut</translation>
+    </message>
+    <message>
+        <source>30 minutes</source>
+        <translation>30 minuten</translation>
+    </message>
+    <message>
+        <source>5 minutes</source>
+        <translation>5 minuten</translation>
+    </message>
+    <message>
+        <source>60 minutes</source>
+        <translation>60 minuten</translation>
+    </message>
+    <message>
+        <source>Date taken</source>
+        <extracomment>Sort photos by the date stored in the photo by the camera</extracomment>
+        <translation>Opnamedatum</translation>
+    </message>
+    <message>
+        <source>Nederlands</source>
+        <extracomment>Name of the language in the language itself; keep it unchanged in every translation</extracomment>
+        <translation>Nederlands</translation>
+    </message>
+    <message>
+        <source>Tourlet projects</source>
+        <translation>Tourlet-projecten</translation>
+    </message>
+    <message>
+        <source>This project has changes that are not saved yet. Save them before Tourlet closes?</source>
+        <translation>Dit project bevat wijzigingen die nog niet zijn opgeslagen. Wilt u ze opslaan voordat Tourlet wordt gesloten?</translation>
+    </message>
+    <message>
+        <source>Save altitude theme</source>
+        <translation>Hoogteprofielthema opslaan</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Opslaan</translation>
+    </message>
+    <message>
+        <source>Choose photos</source>
+        <translation>Foto&apos;s kiezen</translation>
+    </message>
+    <message>
+        <source>Cut</source>
+        <extracomment>Change between photos: straight cut</extracomment>
+        <translation>Knip</translation>
+    </message>
+    <message>
+        <source>Fade</source>
+        <extracomment>Change between photos: cross-fade</extracomment>
+        <translation>Overvloeien</translation>
+    </message>
+    <message>
+        <source>Turn</source>
+        <extracomment>Change between photos: the next photo turns in</extracomment>
+        <translation>Draaien</translation>
+    </message>
+    <message>
+        <source>Zoom</source>
+        <extracomment>Change between photos: the next photo grows from the centre</extracomment>
+        <translation>Zoomen</translation>
+    </message>
+</context>
+<context>
+    <name>MapView</name>
+    <message>
+        <source>This project has changes that are not saved yet. Save them first?</source>
+        <translation>Dit project bevat wijzigingen die nog niet zijn opgeslagen. Eerst opslaan?</translation>
+    </message>
+</context>
+<context>
+    <name>MessageBox</name>
+    <message>
+        <source>Save</source>
+        <translation>Opslaan</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuleren</translation>
+    </message>
+    <message>
+        <source>Don&apos;t save</source>
+        <translation>Niet opslaan</translation>
+    </message>
+    <message>
+        <source>Send the film</source>
+        <translation>Film verzenden</translation>
+    </message>
+    <message>
+        <source>Show the tutorial</source>
+        <translation>Uitleg tonen</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Verwijderen</translation>
+    </message>
+    <message>
+        <source>Open the system settings</source>
+        <translation>Systeeminstellingen openen</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>ProgressView</name>
+    <message>
+        <source>Exporting the film</source>
+        <translation>Film wordt geëxporteerd</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>Share of the film exported so far</extracomment>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Hide window</source>
+        <translation>Venster verbergen</translation>
+    </message>
+    <message>
+        <source>Stop export</source>
+        <translation>Export stoppen</translation>
+    </message>
+</context>
+<context>
+    <name>ProjectToolBar</name>
+    <message>
+        <source>New project</source>
+        <translation>Nieuw project</translation>
+    </message>
+    <message>
+        <source>Open project</source>
+        <translation>Project openen</translation>
+    </message>
+    <message>
+        <source>Open track</source>
+        <translation>Track openen</translation>
+    </message>
+    <message>
+        <source>Save project</source>
+        <translation>Project opslaan</translation>
+    </message>
+    <message>
+        <source>Export route as GPX</source>
+        <translation>Route als GPX exporteren</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Taal</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Volledig scherm</translation>
+    </message>
+</context>
+<context>
+    <name>ToolBarButton</name>
+    <message>
+        <source>%1 (%2)</source>
+        <translation>%1 (%2)</translation>
+    </message>
+</context>
+</TS>
