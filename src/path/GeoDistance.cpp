@@ -40,7 +40,7 @@ double GeoDistanceFrom::term(double lat, double lon) const
 
 double GeoDistanceFrom::termAtLeast(double lat, double lon) const
 {
-    if (!m_valid || !validCoordinate(lat, lon))
+    if (!m_valid || !isValidCoordinate(lat, lon))
         return 0.0;
     // sin(t) >= 2t / pi on [0, pi/2], and cos moves by at most the angle it is moved by.
     const double dLat = std::fabs(qDegreesToRadians(lat - m_lat));
