@@ -10,18 +10,16 @@ namespace {
 
 constexpr int32_t fixedDuration = 3600;
 
-// A track as the reader hands it over: every track point a key point.
-Path trackPath(const std::vector<QPointF> &points, const QStringList &titles = {})
+// A track as the reader hands it over, its altitudes counting up from 0, converted.
+Path converted(const std::vector<QPointF> &points, uint32_t aliasing, bool ownFile, const QVector<QString> &titles = {})
 {
+    TrackPoints track;
+    for (size_t i = 0; i < points.size(); ++i)
+        track.push_back({points[i].x(), points[i].y(), double(i), true, titles.value(int(i))});
     Path path;
     path.curveMode = CurveMode::Straight;
     path.pathType = PathType::GPX;
-    for (size_t i = 0; i < points.size(); ++i) {
-        KeyPoint k(points[i].x(), points[i].y(), double(i));
-        if (int(i) < titles.size())
-            k.properties.title = titles[int(i)];
-        path.addKeyPoint(k, false);
-    }
+    path.convertFromGPX(track, aliasing, ownFile, fixedDuration);
     return path;
 }
 
@@ -36,9 +34,9 @@ std::vector<QPointF> line(int count, double metres, double lat = 0.0)
 }
 
 // The thinning done the plain way: every sample of every leg, measured in turn.
-std::vector<QPointF> thinPlainly(const std::vector<QPointF> &keys, double threshold)
+QVector<QPointF> thinPlainly(const std::vector<QPointF> &keys, double threshold)
 {
-    std::vector<QPointF> curve;
+    QVector<QPointF> curve;
     for (size_t l = 0; l + 1 < keys.size(); ++l) {
         CurveGenerator::Leg samples = CurveGenerator::StraightLeg(keys[l], keys[l + 1]).samples();
         if (l + 2 == keys.size())
@@ -62,69 +60,48 @@ class TestTrackConversion : public QObject
 private slots:
     void withoutThinning()
     {
-        Path path = trackPath(line(101, 50), {QStringLiteral("start"), QString(), QStringLiteral("titled")});
-        QVERIFY(path.convertFromGPX(0, false, fixedDuration));
+        const Path path = converted(line(101, 50), 0, false, {QStringLiteral("start"), QString(), QStringLiteral("titled")});
         QCOMPARE(path.curvePoints.size(), size_t(101));
         QCOMPARE(path.keyPoints.size(), size_t(2));
         QCOMPARE(path.keyPoints.front().title(), QStringLiteral("start"));
-        QCOMPARE(path.pathSegments.size(), size_t(2));
         QCOMPARE(path.pathSegments.front().curvePoints.size(), size_t(101));
-        QVERIFY(path.pathSegments.back().curvePoints.empty());
-        QCOMPARE(path.curvePoints.front().correspondingKeyPoint, path.keyPoints.front().id);
         QCOMPARE(path.curvePoints.back().correspondingKeyPoint, path.keyPoints.back().id);
         QCOMPARE(path.curvePoints[50].z, 50.0);
         QCOMPARE(path.keyPoints.front().correspondingPathSegmentId, path.pathSegments.front().id);
     }
 
+    // Over 200 samples the first leg lasts 3 ms a sample, up to them the default.
     void durationFollowsTheSampleCount()
     {
-        Path short200 = trackPath(line(200, 50));
-        short200.convertFromGPX(0, false, fixedDuration);
-        QCOMPARE(short200.keyPoints.front().properties.durationToNextKP, 3000);
-        Path long201 = trackPath(line(201, 50));
-        long201.convertFromGPX(0, false, fixedDuration);
-        QCOMPARE(long201.keyPoints.front().properties.durationToNextKP, 603);
-        QCOMPARE(long201.keyPoints.back().properties.durationToNextKP, 3000);
+        QCOMPARE(converted(line(200, 50), 0, false).keyPoints.front().properties.durationToNextKP, 3000);
+        QCOMPARE(converted(line(201, 50), 0, false).keyPoints.front().properties.durationToNextKP, 603);
     }
 
     void ownFileKeepsTitledPoints()
     {
-        QStringList titles;
-        for (int i = 0; i < 60; ++i)
-            titles << QString();
+        QVector<QString> titles(60);
         titles[10] = QStringLiteral("Bridge");
         titles[25] = QStringLiteral("Summit");
         titles[40] = QStringLiteral("Hut");
-        Path own = trackPath(line(60, 100), titles);
-        own.convertFromGPX(2, true, fixedDuration);
-        QCOMPARE(own.keyPoints.size(), size_t(5));
-        QCOMPARE(own.keyPoints[1].title(), QStringLiteral("Bridge"));
-        QCOMPARE(own.keyPoints[3].title(), QStringLiteral("Hut"));
+        const Path own = converted(line(60, 100), 2, true, titles);
+        QStringList kept;
         for (const KeyPoint &k : own.keyPoints) {
-            int named = 0;
-            for (const CurvePoint &c : own.curvePoints) {
-                if (c.correspondingKeyPoint == k.id) {
-                    ++named;
-                    QCOMPARE(c.x, k.x);
-                    QCOMPARE(c.y, k.y);
-                }
-            }
-            QCOMPARE(named, 1);
+            kept << k.title();
+            const CurvePoint &c = own.curvePoints[size_t(own.curvePointIndexNaming(k.id))];
+            QCOMPARE(QPointF(c.x, c.y), QPointF(k.x, k.y));
         }
+        QCOMPARE(kept, (QStringList{QString(), QStringLiteral("Bridge"), QStringLiteral("Summit"), QStringLiteral("Hut"), QString()}));
 
-        Path foreign = trackPath(line(60, 100), titles);
-        foreign.convertFromGPX(2, false, fixedDuration);
+        const Path foreign = converted(line(60, 100), 2, false, titles);
         QCOMPARE(foreign.keyPoints.size(), size_t(2));
-        for (const KeyPoint &k : foreign.keyPoints)
-            QVERIFY(k.title().isEmpty());
+        QVERIFY(foreign.keyPoints.front().title().isEmpty());
     }
 
     void repeatedPointsGo()
     {
         std::vector<QPointF> points = line(10, 100);
         points.insert(points.begin() + 4, points[4]);
-        Path path = trackPath(points, {QString(), QString(), QString(), QString(), QString(), QStringLiteral("twice")});
-        path.convertFromGPX(3, true, fixedDuration);
+        const Path path = converted(points, 3, true, {QString(), QString(), QString(), QString(), QString(), QStringLiteral("twice")});
         QCOMPARE(path.keyPoints.size(), size_t(3));
         QCOMPARE(path.keyPoints[1].title(), QStringLiteral("twice"));
         QCOMPARE(path.keyPoints[1].x, points[4].x());
@@ -143,11 +120,7 @@ private slots:
             }
             return points;
         };
-        auto curveSize = [&](int count, uint32_t aliasing) {
-            Path path = trackPath(alternating(count));
-            path.convertFromGPX(aliasing, false, fixedDuration);
-            return path.curvePoints.size();
-        };
+        auto curveSize = [&](int count, uint32_t aliasing) { return converted(alternating(count), aliasing, false).curvePoints.size(); };
         QCOMPARE(curveSize(10000, 1), curveSize(10000, 3));
         QVERIFY(curveSize(10000, 1) != curveSize(10000, 2));
         QCOMPARE(curveSize(10001, 1), curveSize(10001, 2));
@@ -166,94 +139,30 @@ private slots:
                 next += QPointF(0.5, 1.5); // a few long legs
             wander.push_back(next);
         }
-        const Path path = trackPath(wander);
+        TrackPoints track;
+        for (const QPointF &p : wander)
+            track.push_back({p.x(), p.y()});
         for (double threshold : {0.0, 1.0, 37.5, 180.0, 1000.0, 50000.0}) {
-            const std::vector<QPointF> expected = thinPlainly(wander, threshold);
             std::vector<CurvePoint> curve;
-            const std::vector<FixedPlace> fixed = thinTrack(path.keyPoints, threshold, curve);
-            QCOMPARE(curve.size(), expected.size());
-            for (size_t i = 0; i < expected.size(); ++i) {
-                QCOMPARE(curve[i].x, expected[i].x());
-                QCOMPARE(curve[i].y, expected[i].y());
-            }
+            const std::vector<FixedPlace> fixed = thinTrack(track, threshold, curve);
+            QVector<QPointF> thinned;
+            for (const CurvePoint &c : curve)
+                thinned << QPointF(c.x, c.y);
+            QCOMPARE(thinned, thinPlainly(wander, threshold));
             QCOMPARE(fixed.size(), size_t(2));
             QCOMPARE(fixed.front().index, size_t(0));
             QCOMPARE(fixed.back().index, curve.size() - 1);
         }
     }
 
-    void filePointsConvertLikeKeyPoints()
-    {
-        // The light points of a file and the key points of a path are one track:
-        // repeats, titles, altitudes and a wrap across the antimeridian included.
-        QRandomGenerator random(5);
-        std::vector<QPointF> wander{{179.95, 60.0}};
-        for (int i = 0; i < 600; ++i) {
-            QPointF next = wander.back() + QPointF(random.bounded(0.002), random.bounded(0.002) - 0.001);
-            if (next.x() > 180)
-                next.setX(next.x() - 360);
-            wander.push_back(i % 50 == 7 ? wander.back() : next);
-        }
-        QStringList titles;
-        for (size_t i = 0; i < wander.size(); ++i)
-            titles << (i % 120 == 8 ? QStringLiteral("stop %1").arg(i) : QString());
-
-        for (uint32_t aliasing : {0u, 1u, 2u, 3u}) {
-            for (bool own : {false, true}) {
-                Path fromKeys = trackPath(wander, titles);
-                fromKeys.convertFromGPX(aliasing, own, 500);
-
-                TrackPoints points;
-                for (size_t i = 0; i < wander.size(); ++i) {
-                    TrackPoint p;
-                    p.longitude = wander[i].x();
-                    p.latitude = wander[i].y();
-                    p.altitude = double(i);
-                    p.hasAltitude = true;
-                    p.name = titles[int(i)];
-                    points.push_back(p);
-                }
-                Path fromFile;
-                fromFile.curveMode = CurveMode::Straight;
-                fromFile.pathType = PathType::GPX;
-                fromFile.convertFromGPX(points, aliasing, own, 500);
-
-                QCOMPARE(fromFile.curvePoints.size(), fromKeys.curvePoints.size());
-                for (size_t i = 0; i < fromKeys.curvePoints.size(); ++i) {
-                    QCOMPARE(fromFile.curvePoints[i].x, fromKeys.curvePoints[i].x);
-                    QCOMPARE(fromFile.curvePoints[i].y, fromKeys.curvePoints[i].y);
-                    QCOMPARE(fromFile.curvePoints[i].z, fromKeys.curvePoints[i].z);
-                    QCOMPARE(fromFile.curvePoints[i].correspondingKeyPoint != 0,
-                             fromKeys.curvePoints[i].correspondingKeyPoint != 0);
-                }
-                QCOMPARE(fromFile.keyPoints.size(), fromKeys.keyPoints.size());
-                for (size_t i = 0; i < fromKeys.keyPoints.size(); ++i) {
-                    QCOMPARE(fromFile.keyPoints[i].title(), fromKeys.keyPoints[i].title());
-                    QCOMPARE(fromFile.keyPoints[i].x, fromKeys.keyPoints[i].x);
-                    QCOMPARE(fromFile.keyPoints[i].properties.durationToNextKP,
-                             fromKeys.keyPoints[i].properties.durationToNextKP);
-                }
-                QCOMPARE(fromFile.pathSegments.size(), fromFile.keyPoints.size());
-                QVERIFY(fromFile.keyPoints.size() >= (own ? size_t(7) : size_t(2)));
-            }
-        }
-    }
-
     void emptyAndTinyTracks()
     {
-        Path empty = trackPath({});
-        QVERIFY(empty.convertFromGPX(1, false, fixedDuration));
-        QVERIFY(empty.keyPoints.empty());
-        QVERIFY(empty.curvePoints.empty());
-
-        Path single = trackPath({{5, 5}});
-        single.convertFromGPX(1, false, fixedDuration);
+        const Path empty = converted({}, 1, false);
+        QVERIFY(empty.keyPoints.empty() && empty.curvePoints.empty());
+        const Path single = converted({{5, 5}}, 1, false);
         QCOMPARE(single.keyPoints.size(), size_t(1));
         QCOMPARE(single.curvePoints.size(), size_t(1));
-
-        Path same = trackPath({{5, 5}, {5, 5}, {5, 5}});
-        same.convertFromGPX(2, false, fixedDuration);
-        QCOMPARE(same.keyPoints.size(), size_t(1));
+        QCOMPARE(converted({{5, 5}, {5, 5}, {5, 5}}, 2, false).keyPoints.size(), size_t(1));
     }
 };
 
