@@ -10,6 +10,7 @@
 #include <QVariantMap>
 
 class PainterPathRenderer_Controller;
+class QKeyEvent;
 class QWidget;
 
 // The map stage and the object the interface talks to: QML reaches it as the
@@ -264,6 +265,17 @@ public slots:
     void showCursor();
     void pathChanged();
 
+    // Map interaction: the pointer, the marker of a key point and the view
+    bool mouseMoved(double longitude, double latitude);
+    void markerMoved(double longitude, double latitude);
+    void setMoveDistance(double distance);
+    void changeKeyPointPosition(int kpId, double longitude, double latitude);
+    void setCenterPosition(double latitude, double longitude);
+    void saveBoundaries(double longitudeTL, double latitudeTL, double longitudeBR, double latitudeBR);
+    void setZoom(double current);
+    void setCurrentTilt(double current);
+    void resetPhotoDrop();
+
 signals:
     // Towards the top-level window
     void closeApp();
@@ -277,6 +289,7 @@ signals:
     void showWaitState(QString text);
     void hideWaitState();
 
+    void keyPointPositionChanged(int kpId, double longitude, double latitude);
     void mediaPointsClear();
     void mediaPointAdded(int id);
 
@@ -349,8 +362,20 @@ signals:
     void routePointsChanged();
     void changeImage(QImage image);
 
+protected:
+    void keyPressEvent(QKeyEvent *event) override;
+
 private:
     void connectSignalList(QObject *signalList);
+    // The lock rule for the hovered key point and the signals that follow a change.
+    void applyMarkerLock(uint32_t keyPointId);
+    bool hoverKeyPoint(double longitude, double latitude);
+    bool hoverPath(double longitude, double latitude);
+    void setMouseOverPath(bool over);
+    void setDebugText(const QString &text);
+    // Key points have moved: the drawn route follows.
+    void keyPointsMoved();
+    void advanceDebugKeys(const QKeyEvent *event);
     void setProjectModified(bool modified);
     void setWindowTitle(const QString &title);
     void newProjectCommand();
@@ -394,6 +419,8 @@ private:
     double m_lastLoadPercent = -1.0;
     double m_timelinePosition = 0.0;
     double m_mouseOverPathPositionPercentage = 0.0;
+    double m_moveDistance = 0.0; // the hit radius in metres
+    int m_debugKeyState = 0;      // progress through the key sequence of the debug overlay
     int m_keypointHoveredID = 0;
     int m_markerMoveSID1 = 0;
     int m_markerMoveSID2 = 0;

@@ -90,6 +90,20 @@ bool QMainController::applyPathMode(int mode)
     return true;
 }
 
+bool QMainController::updateMarkerLock(uint32_t keyPointId)
+{
+    bool locked = false;
+    const Path *path = m_document->pathManager().active();
+    if (path && path->isFixedTrack()) {
+        const std::vector<KeyPoint> &keyPoints = path->keyPoints;
+        locked = keyPoints.empty() || keyPoints.front().id == keyPointId || keyPoints.back().id == keyPointId;
+    }
+    if (locked == m_markerLocked)
+        return false;
+    m_markerLocked = locked;
+    return true;
+}
+
 QString QMainController::fileFilter(FilterKind kind) const
 {
     const QString all = getString(QStringLiteral("strAllSupportedfiles"));

@@ -67,6 +67,9 @@ public:
 
     bool isFirstStart() const { return m_isFirstStart; }
     bool markerLocked() const { return m_markerLocked; }
+    // The lock of the hovered key point `keyPointId` (0 for none): the first and last
+    // key point of a track stay where they are. True when the lock changed.
+    bool updateMarkerLock(uint32_t keyPointId);
     QString programVersion() const { return m_programVersion; }
 
     FileDialogs &fileDialogs() { return *m_fileDialogs; }

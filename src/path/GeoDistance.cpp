@@ -42,13 +42,16 @@ double GeoDistanceFrom::termAtLeast(double lat, double lon) const
 {
     if (!m_valid || !isValidCoordinate(lat, lon))
         return 0.0;
-    // sin(t) >= 2t / pi on [0, pi/2], and cos moves by at most the angle it is moved by.
+    // sin(t) >= t - t^3 / 6 for t >= 0, and cos moves by at most the angle it is moved by.
+    const auto sinBelow = [](double t) { return t * (1 - t * t / 6); };
     const double dLat = std::fabs(qDegreesToRadians(lat - m_lat));
     double dLon = std::fabs(qDegreesToRadians(lon - m_lon));
     if (dLon > M_PI)
         dLon = 2 * M_PI - dLon;
     const double cosLat = std::max(0.0, m_cosLat - dLat);
-    const double bound = (dLat * dLat + m_cosLat * cosLat * dLon * dLon) / (M_PI * M_PI);
+    const double sLat = sinBelow(dLat / 2);
+    const double sLon = sinBelow(dLon / 2);
+    const double bound = sLat * sLat + m_cosLat * cosLat * sLon * sLon;
     return bound * (1 - 1e-9); // room for rounding
 }
 

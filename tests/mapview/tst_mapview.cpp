@@ -105,6 +105,9 @@ private slots:
     void loadStateSkipsSmallSteps();
     void listTitlesAreKeysUntilStringsArrive();
     void signalListReachesSlots();
+    void pointerHover_data();
+    void pointerHover();
+    void trackMarkerSlidesBetweenLockedEnds();
 };
 
 void tst_MapView::messageBoxActions_data()
@@ -362,6 +365,103 @@ void tst_MapView::signalListReachesSlots()
     QVERIFY(QMetaObject::invokeMethod(signalList, "saveProject"));
     QVERIFY(QFileInfo::exists(stage.file("kept.zkgeo")));
     QVERIFY(!stage.view.projectModified());
+}
+
+void tst_MapView::pointerHover_data()
+{
+    // A pointer `offset` metres north of a place on a route from (50, 10) to (50, 11):
+    // on its first key point or halfway along it, with a hit radius of `radius` times
+    // the offset.
+    QTest::addColumn<bool>("halfway");
+    QTest::addColumn<double>("radius");
+    QTest::addColumn<QString>("hovered");
+    QTest::newRow("key point inside the radius") << false << 1.001 << "keyPoint";
+    QTest::newRow("key point exactly at the radius") << false << 1.0 << "nothing";
+    QTest::newRow("radius zero") << false << 0.0 << "nothing";
+    QTest::newRow("route inside the radius") << true << 1.5 << "route";
+    QTest::newRow("route outside the radius") << true << 0.5 << "nothing";
+}
+
+void tst_MapView::pointerHover()
+{
+    QFETCH(bool, halfway);
+    QFETCH(double, radius);
+    QFETCH(QString, hovered);
+    Stage stage;
+    Path &path = stage.document.pathManager().activeChecked();
+    path.addKeyPoint(10.0, 50.0, 0.0, QStringLiteral("A"), false);
+    path.addKeyPoint(11.0, 50.0, 0.0, QStringLiteral("B"), true);
+    QVERIFY(path.curvePoints.size() > 10);
+
+    // Halfway, the pointer stands north of the sample nearest to the middle; the
+    // key point test alone (one key point, no route) decides the first rows.
+    const CurvePoint middle = path.curvePoints[path.curvePoints.size() / 2];
+    if (!halfway)
+        path.curvePoints.clear();
+    const QGeoCoordinate target = halfway ? QGeoCoordinate(middle.y, middle.x) : QGeoCoordinate(50.0, 10.0);
+    const QGeoCoordinate pointer = target.atDistanceAndAzimuth(400.0, 0.0);
+    stage.view.setMoveDistance(radius * pointer.distanceTo(target));
+
+    const bool any = stage.view.mouseMoved(pointer.longitude(), pointer.latitude());
+    const int marked = int(std::count_if(path.curvePoints.begin(), path.curvePoints.end(),
+                                         [](const CurvePoint &sample) { return sample.tt != 0; }));
+    const QString seen = stage.view.keypointHoveredID() != 0 ? QStringLiteral("keyPoint")
+                         : stage.view.mouseOverPath()       ? QStringLiteral("route")
+                                                            : QStringLiteral("nothing");
+    QCOMPARE(seen, hovered);
+    QCOMPARE(any, hovered != QLatin1String("nothing"));
+    QCOMPARE(marked, hovered == QLatin1String("route") ? 1 : 0);
+    if (hovered == QLatin1String("keyPoint"))
+        QCOMPARE(uint32_t(stage.view.keypointHoveredID()), path.keyPoints.front().id);
+    if (hovered == QLatin1String("route")) {
+        QCOMPARE(stage.view.mouseOverPathPosition(), target);
+        QVERIFY(std::abs(stage.view.mouseOverPathPositionPercentage() - 0.5) < 0.01);
+    }
+
+    // Moving away clears the hover and the mark.
+    stage.view.mouseMoved(0.0, 0.0);
+    QVERIFY(!stage.view.mouseOverPath() && stage.view.keypointHoveredID() == 0);
+    QVERIFY(std::none_of(path.curvePoints.begin(), path.curvePoints.end(),
+                         [](const CurvePoint &sample) { return sample.tt != 0; }));
+}
+
+void tst_MapView::trackMarkerSlidesBetweenLockedEnds()
+{
+    Stage stage;
+    QByteArray withStop = ride;
+    withStop.replace("<trk>", "<wpt lat=\"51.058\" lon=\"13.711\"><name>Stop</name></wpt><trk>");
+    stage.view.openFile(writeTestFile(stage.dir, QStringLiteral("ride.gpx"), withStop));
+    QVERIFY(stage.waitForLoad());
+    const Path &path = *stage.document.pathManager().active();
+    QCOMPARE(path.keyPoints.size(), size_t(3));
+    stage.view.setMoveDistance(50.0);
+
+    // The ends of a track are locked, the stop between them is not.
+    const bool lockedAt[] = {true, false, true};
+    for (int i : {0, 2, 1}) {
+        const KeyPoint &point = path.keyPoints[size_t(i)];
+        QVERIFY(stage.view.mouseMoved(point.x, point.y));
+        QCOMPARE(uint32_t(stage.view.keypointHoveredID()), point.id);
+        QCOMPARE(stage.view.markerLocked(), lockedAt[i]);
+    }
+
+    // Dragged towards the end, the stop's marker snaps to a sample of its two legs and
+    // names both segments; dropped, the stop moves there and the drag ends.
+    const KeyPoint stop = path.keyPoints[1];
+    stage.view.markerMoved(13.7235, 51.0655);
+    const QGeoCoordinate snapped = stage.view.mouseOverPathPosition();
+    const auto onTrack = std::find_if(path.curvePoints.begin(), path.curvePoints.end(), [&](const CurvePoint &s) {
+        return QGeoCoordinate(s.y, s.x) == snapped;
+    });
+    QVERIFY(onTrack != path.curvePoints.end() && onTrack != path.curvePoints.end() - 1);
+    QVERIFY(snapped.distanceTo(QGeoCoordinate(51.066, 13.724)) < snapped.distanceTo(QGeoCoordinate(stop.y, stop.x)));
+    QCOMPARE(uint32_t(stage.view.markerMoveSID1()), path.pathSegments[0].id);
+    QCOMPARE(uint32_t(stage.view.markerMoveSID2()), path.pathSegments[1].id);
+
+    stage.view.changeKeyPointPosition(int(stop.id), snapped.longitude(), snapped.latitude());
+    QCOMPARE(QGeoCoordinate(path.keyPoints[1].y, path.keyPoints[1].x), snapped);
+    QCOMPARE(stage.view.markerMoveSID1(), 0);
+    QVERIFY(stage.view.projectModified());
 }
 
 QTEST_MAIN(tst_MapView)

@@ -1,6 +1,7 @@
 #include "path/CurveGenerator.h"
 #include "path/GeoDistance.h"
 #include "path/NearestSample.h"
+#include "path/PointerSearch.h"
 #include "path/Path.h"
 
 #include <QGeoCoordinate>
@@ -389,6 +390,19 @@ private slots:
                 const size_t first = random.bounded(count), last = first + random.bounded(count - int(first) + 1);
                 QCOMPARE(path.nearestCurvePoint(qlon, qlat, first, last),
                          walk(from, std::numeric_limits<double>::infinity(), first, last));
+
+                // The pointer's search in metres with a strict radius, which at times is
+                // exactly the distance to the sample the place was made near.
+                const double radius = query % 3 == 0 ? geoDistance(qlat, qlon, near.y, near.x) : uniform(0, 1e5);
+                int pointed = -1;
+                for (size_t i = 0, best = 0; i < samples.size(); ++i) {
+                    const double d = geoDistance(qlat, qlon, samples[i].y, samples[i].x);
+                    if ((pointed < 0 ? radius : geoDistance(qlat, qlon, samples[best].y, samples[best].x)) > d) {
+                        pointed = int(i);
+                        best = i;
+                    }
+                }
+                QCOMPARE(PointerSearch::sampleAt(samples, 1.0, qlat, qlon, radius).index, pointed);
             }
         }
         QVERIFY(found > 4000);
