@@ -555,13 +555,22 @@ uint32_t KeyPointItemsData::insertKeyPoint(uint32_t afterId, double longitude, d
     return id;
 }
 
-bool KeyPointItemsData::deleteFromPath(uint32_t id)
+bool KeyPointItemsData::deleteFromPath(uint32_t id, bool regenerate)
 {
     Path *p = path();
-    if (!p || p->keyPointIndex(id) < 0 || !p->deleteKeyPoint(id))
+    if (!p || p->keyPointIndex(id) < 0 || !p->deleteKeyPoint(id, regenerate))
         return false;
+    // Without a route there is no place to show photos at.
+    if (p->keyPoints.empty())
+        p->mediaPoints.clear();
     markChanged();
     return true;
+}
+
+void KeyPointItemsData::regenerateCurve()
+{
+    if (Path *p = path())
+        p->update();
 }
 
 void KeyPointItemsData::removeRecord(int row)
@@ -570,7 +579,6 @@ void KeyPointItemsData::removeRecord(int row)
     m_items.erase(m_items.begin() + row);
     if (id == m_activeKeyPointId)
         clearActive();
-    refreshOrderIndices();
 }
 
 std::vector<uint32_t> KeyPointItemsData::mediaPointIds() const

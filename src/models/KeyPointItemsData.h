@@ -122,8 +122,11 @@ public:
     uint32_t appendKeyPoint(double longitude, double latitude, double altitude, const QString &title);
     uint32_t insertKeyPoint(uint32_t afterId, double longitude, double latitude, double altitude,
                             const QString &title);
-    // Deletes the key point from the path; its record stays until removeRecord.
-    bool deleteFromPath(uint32_t id);
+    // Deletes the key point from the path; its record stays until removeRecord. Without
+    // `regenerate` the curve waits for regenerateCurve. The last key point takes the
+    // path's media points with it.
+    bool deleteFromPath(uint32_t id, bool regenerate = true);
+    void regenerateCurve();
     void removeRecord(int row);
     std::vector<uint32_t> mediaPointIds() const;
 

@@ -381,16 +381,20 @@ void QKeyPointItemsModel::deleteKeyPoint(int kpId)
     if (!m_data)
         return;
     if (uint32_t(kpId) != allPoints) {
-        deleteOneKeyPoint(uint32_t(kpId));
+        deleteOneKeyPoint(uint32_t(kpId), true);
         return;
     }
     std::vector<uint32_t> ids;
     for (const KeyPointItem &item : m_data->items())
         ids.push_back(item.elementId);
-    std::for_each(ids.rbegin(), ids.rend(), [this](uint32_t id) { deleteOneKeyPoint(id); });
+    // The curve is made once at the end, not once per point.
+    std::for_each(ids.rbegin(), ids.rend(), [this](uint32_t id) { deleteOneKeyPoint(id, false); });
+    m_data->regenerateCurve();
+    emit pathChanged();
+    updatePathSegments(true);
 }
 
-void QKeyPointItemsModel::deleteOneKeyPoint(uint32_t id)
+void QKeyPointItemsModel::deleteOneKeyPoint(uint32_t id, bool regenerate)
 {
     const int row = m_data->rowOf(id);
     if (row < 0)
@@ -398,7 +402,7 @@ void QKeyPointItemsModel::deleteOneKeyPoint(uint32_t id)
     const uint32_t sId = m_data->segmentIdOf(id);
     const bool wasActive = m_data->activeKeyPointId() == id;
     const std::vector<uint32_t> mediaBefore = m_data->mediaPointIds();
-    if (!m_data->deleteFromPath(id))
+    if (!m_data->deleteFromPath(id, regenerate))
         return;
     beginRemoveRows(QModelIndex(), row, row);
     m_data->removeRecord(row);
@@ -413,8 +417,10 @@ void QKeyPointItemsModel::deleteOneKeyPoint(uint32_t id)
     emit deletePathSegment(int(sId));
     emit sizeChanged();
     emit allKeyPointsEnabledStateChanged();
-    emit pathChanged();
-    updatePathSegments(true);
+    if (regenerate) {
+        emit pathChanged();
+        updatePathSegments(true);
+    }
     if (wasActive) {
         emit activeKeyPointIdChanged();
         emit activeItemChanged();

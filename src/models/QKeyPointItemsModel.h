@@ -124,7 +124,8 @@ public slots:
     // Appends, or inserts on the route where the user marked it. Refused while a
     // track's key points are fixed, unless inserted on the route.
     void addKeyPoint(double longitude, double latitude, double altitude, QString title);
-    // -1: all points.
+    // -1: all points. Photos on the point's sample go with it, and all photos with the
+    // last point.
     void deleteKeyPoint(int kpId);
     void deleteMediaPoint(int mpId);
 
@@ -132,7 +133,7 @@ private:
     void editScope(int code, const QVariant &value);
     void emitMarkerChange(uint32_t scope, int code);
     void emitRowsChanged(uint32_t scope, const QVector<int> &roles = {});
-    void deleteOneKeyPoint(uint32_t id);
+    void deleteOneKeyPoint(uint32_t id, bool regenerate);
 
     KeyPointItemsData *m_data = nullptr;
 };

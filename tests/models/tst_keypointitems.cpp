@@ -300,6 +300,8 @@ private slots:
         const CurvePoint &onSecond = s.path().curvePoints[size_t(s.path().curvePointIndexNaming(points[1].id))];
         const MediaPoint media(onSecond.x, onSecond.y, 0.0);
         s.path().addMediaPoint(media, points[1].id, false);
+        const CurvePoint &onLeg = s.path().curvePoints[20];
+        s.path().addMediaPoint(MediaPoint(onLeg.x, onLeg.y, 0.0), 0, false);
         QSignalSpy deleted(&s.model, &QKeyPointItemsModel::keyPointDeleted);
         QSignalSpy segments(&s.model, &QKeyPointItemsModel::deletePathSegment);
         QSignalSpy photos(&s.model, &QKeyPointItemsModel::mediaPointDeleted);
@@ -313,8 +315,10 @@ private slots:
         QCOMPARE(deleted.count(), 3);
         QCOMPARE(deleted.first()[0].toUInt(), points[2].id);
         QCOMPARE(segments.count(), 3);
-        QCOMPARE(photos.count(), 1);
+        // The photo on the second point goes with it, the one on the route with the route.
+        QCOMPARE(photos.count(), 2);
         QCOMPARE(photos.first()[0].toUInt(), media.id);
+        QVERIFY(s.path().mediaPoints.empty());
         QCOMPARE(s.model.activeKeyPointId(), 0);
     }
 
