@@ -15,9 +15,9 @@ namespace {
 
 const char *propertyKeyOf(int code)
 {
-    static const char *const keys[] = {"size",     "animationDuration",   "pauseDuration", "keyPointFontFrame",
-                                       "keyPointFontColor", "keyPointFontShadow", "keyPointFont",  "enabled",
-                                       "enabledForAnimation", "title",  "keyPointImageSource"};
+    static const char *const keys[] = {"size", "animationDuration", "pauseDuration", "keyPointFontFrame",
+                                       "keyPointFontColor", "keyPointFontShadow", "keyPointFont", "enabled",
+                                       "enabledForAnimation", "title", "keyPointImageSource"};
     return code >= 0 && code < int(std::size(keys)) ? keys[code] : nullptr;
 }
 
@@ -388,7 +388,7 @@ const PoolPhoto *KeyPointItemsData::nextFreePhoto() const
 bool KeyPointItemsData::setImage(uint32_t id, uint32_t imageId)
 {
     const int row = id == allPoints ? -1 : rowOf(id);
-    if (!path() || (id != allPoints && row < 0))
+    if (!path() || m_items.empty() || (id != allPoints && row < 0))
         return false;
     QVariantMap map;
     if (!m_imageItems.itemById(imageId, map))
@@ -404,12 +404,14 @@ bool KeyPointItemsData::setImage(uint32_t id, uint32_t imageId)
         symbol.sourceFileName = interfaceFileUrl(file);
     }
 
+    bool changed = false;
     for (size_t r = 0; r < m_items.size(); ++r) {
         if (row >= 0 && int(r) != row)
             continue;
         KeyPoint *point = keyPoint(m_items[r].elementId);
         if (!point)
             continue;
+        changed = true;
         KeyPointProperties &p = point->properties;
         p.imageSource = symbol.sourceFileName;
         p.isMediaTemplate = symbol.isMediaTemplate;
@@ -426,6 +428,8 @@ bool KeyPointItemsData::setImage(uint32_t id, uint32_t imageId)
         }
         m_items[r].assignFrom(*point);
     }
+    if (!changed)
+        return false;
     refreshActiveItem({"keyPointImageSource", "isMediaTemplate", "mediaCenterPositionOffset", "mediaSourceSize"});
     markChanged();
     return true;

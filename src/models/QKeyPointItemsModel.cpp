@@ -65,12 +65,10 @@ void QKeyPointItemsModel::setData(KeyPointItemsData *data)
 void QKeyPointItemsModel::connectSignalList(QObject *root)
 {
     static const char *const names[] = {
-        "setCurrentSettingsPage", "setActiveKeyPointId",          "enableAllKeyPoints",
-        "enableKeyPoint",         "setKeyPointImage",             "setKeyPointSize",
-        "setKeyPointPauseDuration", "setKeyPointAnimationDuration", "setKeyPointText",
-        "openFontDialog",         "setKeyPointFontColor",         "setKeyPointFontFrame",
-        "setKeyPointFontShadow",  "setUserPhotoAsWaypoint",       "addKeyPoint",
-        "deleteKeyPoint",         "deleteMediaPoint"};
+        "setCurrentSettingsPage", "setActiveKeyPointId", "enableAllKeyPoints", "enableKeyPoint", "setKeyPointImage",
+        "setKeyPointSize", "setKeyPointPauseDuration", "setKeyPointAnimationDuration", "setKeyPointText",
+        "openFontDialog", "setKeyPointFontColor", "setKeyPointFontFrame", "setKeyPointFontShadow",
+        "setUserPhotoAsWaypoint", "addKeyPoint", "deleteKeyPoint", "deleteMediaPoint"};
     const QString objectName = QStringLiteral("KeyPointItemsSignalList_Obj");
     QObject *list = root ? root->findChild<QObject *>(objectName) : nullptr;
     if (!list)

@@ -407,6 +407,13 @@ private slots:
             last = value;
         }
 
+        // The chart's distances run along the route, which is about straight here.
+        QSignalSpy altitude(&s.model, &QKeyPointItemsModel::altitudeDataChanged);
+        s.model.updateAltitudeData();
+        const QVariantList distances = altitude.first()[1].toList();
+        QCOMPARE(distances.size(), int(s.path().curvePoints.size()));
+        QVERIFY(qAbs(distances.last().toDouble() - QGeoCoordinate(0, 0).distanceTo(QGeoCoordinate(2, 2))) < 1000.0);
+
         QSignalSpy cleared(&s.model, &QKeyPointItemsModel::clearAllObjects);
         s.model.clear();
         QCOMPARE(cleared.count(), 1);
