@@ -546,9 +546,12 @@ uint32_t KeyPointItemsData::insertKeyPoint(uint32_t afterId, double longitude, d
     const uint32_t id = point.id;
     p->insertKeyPoint(afterId, point, true);
 
-    const PathSegment *before = p->segmentForKeyPoint(afterId);
+    PathSegment *before = p->segmentForKeyPoint(afterId);
     if (PathSegment *added = p->segmentForKeyPoint(id); added && before)
         added->setPilot(before->pilot, true);
+    // The leg before ends at the new point now, also on a track, whose curve stays.
+    if (before)
+        before->changed = true;
     KeyPointItem item;
     item.assignFrom(p->keyPoints.at(size_t(p->keyPointIndex(id))));
     m_items.insert(m_items.begin() + afterRow + 1, item);

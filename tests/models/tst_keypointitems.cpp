@@ -290,6 +290,8 @@ private slots:
         QCOMPARE(inserted.first()[1].toUInt(), segment);
         QVERIFY(!inserted.first()[2].value<QGeoPath>().path().isEmpty());
         QCOMPARE(changed.first()[0].toUInt(), segment);
+        QVERIFY(std::any_of(changed.begin(), changed.end(),
+                            [&](const QList<QVariant> &args) { return args[0].toUInt() == inserted.first()[0].toUInt(); }));
     }
 
     void deletingAll()
