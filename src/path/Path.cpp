@@ -150,7 +150,7 @@ void Path::insertKeyPoint(uint32_t afterId, const KeyPoint &point, bool doUpdate
         regenerate(true);
 }
 
-bool Path::deleteKeyPoint(uint32_t id)
+bool Path::deleteKeyPoint(uint32_t id, bool doUpdate)
 {
     const int index = keyPointIndex(id);
     if (index < 0)
@@ -183,7 +183,8 @@ bool Path::deleteKeyPoint(uint32_t id)
         }
     }
     keyPoints.erase(keyPoints.begin() + index);
-    update();
+    if (doUpdate)
+        update();
     return true;
 }
 

@@ -52,7 +52,8 @@ public:
     void addKeyPoint(const KeyPoint &point, bool update);
     void addMediaPoint(const MediaPoint &point, uint32_t keyPointId, bool useIndex);
     void insertKeyPoint(uint32_t afterId, const KeyPoint &point, bool update);
-    bool deleteKeyPoint(uint32_t id);
+    // `update` off leaves the curve as it is, for deleting many points at once.
+    bool deleteKeyPoint(uint32_t id, bool update = true);
     bool deleteMediaPoint(uint32_t id);
     // Also frees the sample that carries it; false when no sample names it.
     bool deleteMediaPointAndSample(uint32_t id);

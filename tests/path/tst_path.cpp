@@ -187,6 +187,20 @@ private slots:
             path.reduceToEnds();
             QCOMPARE(path.keyPoints.size(), size_t(2));
             checkInvariants(path, true);
+
+            // Several deletions and one regeneration make the curve of deleting one by one.
+            Path oneByOne = makePath(mode, {{0, 0}, {5, 5}, {10, 0}, {15, 5}, {20, 0}});
+            Path atOnce = oneByOne;
+            for (size_t i = 3; i >= 1; --i) {
+                QVERIFY(oneByOne.deleteKeyPoint(oneByOne.keyPoints[i].id));
+                QVERIFY(atOnce.deleteKeyPoint(atOnce.keyPoints[i].id, false));
+            }
+            atOnce.update();
+            checkInvariants(atOnce, true);
+            QCOMPARE(atOnce.curvePoints.size(), oneByOne.curvePoints.size());
+            for (size_t i = 0; i < atOnce.curvePoints.size(); ++i)
+                QCOMPARE(QPointF(atOnce.curvePoints[i].x, atOnce.curvePoints[i].y),
+                         QPointF(oneByOne.curvePoints[i].x, oneByOne.curvePoints[i].y));
         }
     }
 

@@ -1,0 +1,32 @@
+#pragma once
+
+#include "models/KeyPointImageItems.h"
+
+#include <QAbstractItemModel>
+
+// The waypoint symbol list for the interface. The list itself belongs to the
+// key point data; this model only shows it.
+class QKeyPointImageItemsModel : public QAbstractItemModel
+{
+    Q_OBJECT
+
+public:
+    enum Role { TitleRole = Qt::UserRole + 1, ImageSourceRole, KeyPointImageItemIdRole, IsAnimatedRole, StyleRole };
+
+    explicit QKeyPointImageItemsModel(QObject *parent = nullptr);
+
+    using QAbstractItemModel::setData;
+    void setData(KeyPointImageItems *items);
+    // Fills the list anew, once the catalogue is loaded.
+    void refill(const std::vector<WaypointItem> &waypoints, const QString &browseTitle);
+
+    QModelIndex index(int row, int column, const QModelIndex &parent = QModelIndex()) const override;
+    QModelIndex parent(const QModelIndex &child) const override;
+    int rowCount(const QModelIndex &parent = QModelIndex()) const override;
+    int columnCount(const QModelIndex &parent = QModelIndex()) const override;
+    QVariant data(const QModelIndex &index, int role) const override;
+    QHash<int, QByteArray> roleNames() const override;
+
+private:
+    KeyPointImageItems *m_items = nullptr;
+};
