@@ -9,6 +9,7 @@
 #include "app/Trace.h"
 #include "app/Translators.h"
 #include "app/gui/StartupSplash.h"
+#include "mapview/QtKeyPointDialogs.h"
 #include "gpx/GpxWriter.h"
 #include "path/PathMode.h"
 #include "project/DocumentAnimationSource.h"
@@ -110,6 +111,8 @@ void MapView::init(QWidget *window, bool hide, const QUrl &source)
     }
     if (QObject *signalList = root->findChild<QObject *>(QStringLiteral("SignalList_Obj")))
         connectSignalList(signalList);
+    initLists();
+    initKeyPointModels(root);
     showSplashMessage(SplashMessage::InitTracking);
     showSplashMessage(SplashMessage::ConnectQml);
 
@@ -125,6 +128,38 @@ void MapView::init(QWidget *window, bool hide, const QUrl &source)
 
     newProjectCommand();
     setProjectModified(false);
+}
+
+void MapView::initLists()
+{
+    AppSettings &settings = m_mainController.settings();
+    const QString folder = programFolder().isEmpty() ? QDir::currentPath() : programFolder();
+    const QString imageRoot = QDir::cleanPath(QDir(folder).absoluteFilePath(QStringLiteral("imgsrc"))) + QLatin1Char('/');
+    ContentCatalogue &catalogue = m_document->catalogue();
+    catalogue.load(imageRoot, settings.pathSetting(QStringLiteral("DynamicContentPath")), currentLanguage());
+    logTrace(0, QStringLiteral("MapView::initLists - %d waypoint symbols from %s"), int(catalogue.waypoints().size()),
+             imageRoot);
+    m_keyPointImageItemsModel.setData(&m_mainController.keyPointData().imageItems());
+    m_keyPointImageItemsModel.refill(catalogue.waypoints(), browseTitle());
+}
+
+QString MapView::browseTitle() const
+{
+    return m_mainController.getString(QStringLiteral("strBrowseOwnContent"));
+}
+
+void MapView::initKeyPointModels(QObject *root)
+{
+    KeyPointItemsData &data = m_mainController.keyPointData();
+    data.setChangedCallback([this] { setProjectModified(true); });
+    data.setDialogs(std::make_unique<QtKeyPointDialogs>(m_mainController, m_window));
+    m_keyPointItemsModel.setData(&data);
+    m_keyPointItemsModel.connectSignalList(root);
+    rootContext()->setContextProperty(QStringLiteral("keyPointItemsModel"), &m_keyPointItemsModel);
+    connect(&m_keyPointItemsModel, &QKeyPointItemsModel::pathChanged, this, &MapView::pathChanged);
+    connect(&m_keyPointItemsModel, &QKeyPointItemsModel::triggerLoadState, this, &MapView::triggerLoadState);
+    connect(this, &MapView::setActiveKeyPointId, &m_keyPointItemsModel, &QKeyPointItemsModel::setActiveKeyPointId);
+    rootContext()->setContextProperty(QStringLiteral("keyPointImageItemsModel"), &m_keyPointImageItemsModel);
 }
 
 void MapView::connectSignalList(QObject *signalList)
@@ -342,6 +377,7 @@ void MapView::newProjectCommand()
 
 void MapView::resetViews()
 {
+    m_keyPointItemsModel.clear();
     emit mediaPointsClear();
     setProjectModified(false);
 
@@ -419,9 +455,7 @@ void MapView::delayedLoadProjectFinish()
     const Path *path = m_document->pathManager().active();
     const int32_t pathType = path ? path->pathType : PathType::Ordinary;
 
-    const size_t keyPointCount = path ? path->keyPoints.size() : 0;
-    for (size_t i = 0; i < keyPointCount; ++i)
-        triggerLoadState(3, 100.0 / double(keyPointCount) * double(i) * 0.5);
+    m_keyPointItemsModel.loadKeyPoints();
 
     setProjectModified(false);
     emit mapFrameSourceChanged();
@@ -437,6 +471,7 @@ void MapView::delayedLoadProjectFinish()
     if (pathType == PathType::GPX) {
         if (Path *active = m_document->pathManager().active())
             active->update();
+        m_keyPointItemsModel.updatePathSegments(true, true);
     }
 
     if (pathType == PathType::GPX || !isProject) {
@@ -641,6 +676,7 @@ void MapView::setPathMode(int mode)
         return;
     setProjectModified(true);
     emit currentPathModeChanged();
+    m_keyPointItemsModel.updatePathSegments();
     pathChanged();
 }
 
@@ -906,6 +942,9 @@ void MapView::setFullScreenDiashow(bool state)
 void MapView::setStrings(QVariantMap stringMap)
 {
     m_mainController.setStrings(stringMap);
+    // The browse item of the symbol list carries a translated title.
+    if (m_keyPointImageItemsModel.rowCount() > 0)
+        m_keyPointImageItemsModel.refill(m_document->catalogue().waypoints(), browseTitle());
     // Not the language list: the interface answers its change by sending the strings.
     emit gpxAliasingCBEntriesChanged();
     emit maxAnimationDurationCBEntriesChanged();

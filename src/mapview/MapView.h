@@ -1,6 +1,8 @@
 #pragma once
 
 #include "mapview/QMainController.h"
+#include "models/QKeyPointImageItemsModel.h"
+#include "models/QKeyPointItemsModel.h"
 
 #include <QGeoCoordinate>
 #include <QQuickView>
@@ -135,6 +137,8 @@ public:
 
     QWidget *container() const { return m_container; }
     QMainController &mainController() { return m_mainController; }
+    QKeyPointItemsModel &keyPointItemsModel() { return m_keyPointItemsModel; }
+    QKeyPointImageItemsModel &keyPointImageItemsModel() { return m_keyPointImageItemsModel; }
 
     // The zoom level at which an extent of `current` degrees fills a view that showed
     // `target` degrees at `zoom`. The result lies in the map's range of zoom levels.
@@ -290,6 +294,8 @@ signals:
     void hideWaitState();
 
     void keyPointPositionChanged(int kpId, double longitude, double latitude);
+    // Makes the key point the one the settings edit.
+    void setActiveKeyPointId(int kpId);
     void mediaPointsClear();
     void mediaPointAdded(int id);
 
@@ -367,6 +373,10 @@ protected:
 
 private:
     void connectSignalList(QObject *signalList);
+    // The content catalogue and the lists made from it, then the waypoint models.
+    void initLists();
+    void initKeyPointModels(QObject *root);
+    QString browseTitle() const;
     // The lock rule for the hovered key point and the signals that follow a change.
     void applyMarkerLock(uint32_t keyPointId);
     bool hoverKeyPoint(double longitude, double latitude);
@@ -431,4 +441,7 @@ private:
     bool m_animationRunning = false;
     bool m_showOverlays = true;
     bool m_debugInfoActive = false;
+
+    QKeyPointItemsModel m_keyPointItemsModel;
+    QKeyPointImageItemsModel m_keyPointImageItemsModel;
 };

@@ -279,5 +279,5 @@ void MapView::advanceDebugKeys(const QKeyEvent *event)
 
 void MapView::keyPointsMoved()
 {
-    pathChanged();
+    m_keyPointItemsModel.updatePathSegments();
 }

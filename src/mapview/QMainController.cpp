@@ -20,7 +20,8 @@ const QString projectExtension = QStringLiteral("zkgeo");
 } // namespace
 
 QMainController::QMainController(PainterPathRenderer_Controller *document, const AppSettings &settings)
-    : m_document(document), m_settings(settings), m_fileDialogs(std::make_unique<QtFileDialogs>())
+    : m_document(document), m_settings(settings), m_fileDialogs(std::make_unique<QtFileDialogs>()),
+      m_keyPointData(document)
 {
     m_actions = {{QStringLiteral("actionNone"), -1},
                  {QStringLiteral("actionNewProject"), 1000},

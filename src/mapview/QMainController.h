@@ -2,6 +2,7 @@
 
 #include "app/AppSettings.h"
 #include "mapview/FileDialogs.h"
+#include "models/KeyPointItemsData.h"
 
 #include <QDateTime>
 #include <QObject>
@@ -72,6 +73,9 @@ public:
     bool updateMarkerLock(uint32_t keyPointId);
     QString programVersion() const { return m_programVersion; }
 
+    // The waypoints of the active path as the interface lists and edits them.
+    KeyPointItemsData &keyPointData() { return m_keyPointData; }
+
     FileDialogs &fileDialogs() { return *m_fileDialogs; }
     void setFileDialogs(std::unique_ptr<FileDialogs> dialogs) { m_fileDialogs = std::move(dialogs); }
 
@@ -81,6 +85,7 @@ private:
     QVariantMap m_strings;
     QVariantMap m_actions;
     std::unique_ptr<FileDialogs> m_fileDialogs;
+    KeyPointItemsData m_keyPointData;
     QString m_programVersion;
     bool m_isFirstStart = false;
     bool m_markerLocked = false;

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "animation/AnimationTiming.h"
+#include "content/ContentCatalogue.h"
 #include "models/AltitudePreset.h"
 #include "models/PhotoPool.h"
 #include "path/PathManager.h"
@@ -77,6 +78,10 @@ public:
     QString programVersion() const { return m_programVersion; }
     void setProgramVersion(const QString &version) { m_programVersion = version; }
 
+    // The installed and user content, scanned once when the window sets up its lists.
+    ContentCatalogue &catalogue() { return m_catalogue; }
+    const ContentCatalogue &catalogue() const { return m_catalogue; }
+
     ExportProperties &exportProperties() { return m_exportProperties; }
     const ExportProperties &exportProperties() const { return m_exportProperties; }
 
@@ -98,4 +103,5 @@ private:
     double m_scale = 1.0;
     QString m_programVersion = QStringLiteral("0.0.0.0");
     ExportProperties m_exportProperties;
+    ContentCatalogue m_catalogue;
 };
