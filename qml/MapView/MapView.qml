@@ -11,6 +11,11 @@ Item {
     width: host.windowSize && host.windowSize.width > 0 ? host.windowSize.width : 1280
     height: host.windowSize && host.windowSize.height > 0 ? host.windowSize.height : 800
 
+    // The item models come after the interface has loaded: null until then.
+    property var waypoints: typeof keyPointItemsModel !== "undefined" ? keyPointItemsModel : null
+    property var waypointSymbols: typeof keyPointImageItemsModel !== "undefined" ? keyPointImageItemsModel : null
+    readonly property int activeWaypointId: waypoints ? waypoints.activeKeyPointId : 0
+
     readonly property var actions: host.messageBoxAction
     readonly property bool modalOpen: messageBox.visible || hintBox.visible
                                       || errorBox.visible || waitState.visible
@@ -44,12 +49,18 @@ Item {
         id: hostStrings
     }
 
+    function editWaypoint(keyPointId) {
+        keyPointRequests.setActiveKeyPointId(keyPointId)
+    }
+
     SignalList {
         id: signalList
     }
     PhotoPoolSignalList {}
     AltitudePresetsSignalList {}
-    KeyPointItemsSignalList {}
+    KeyPointItemsSignalList {
+        id: keyPointRequests
+    }
     KeyPointImageItemsSignalList {}
     PilotItemsSignalList {}
     TrackingList {}
@@ -58,6 +69,7 @@ Item {
 
     WorldMap {
         id: worldMap
+        objectName: "mapStage"
         anchors.fill: parent
         locationSettings: host.locationSettings
         onViewMoved: {
@@ -68,6 +80,27 @@ Item {
             if (typeof host.setZoom === "function")
                 host.setZoom(zoomLevel)
         }
+
+        waypointModel: root.waypoints
+        pathSettings: host.pathSettings
+        activeWaypointId: root.activeWaypointId
+        hoveredWaypointId: host.keypointHoveredID
+        overRoute: host.mouseOverPath
+        routePosition: host.mouseOverPathPosition
+        keyPointsFixed: host.keyPointsFixed
+        markerLocked: host.markerLocked
+        onPointerMoved: signalList.mouseMoved(longitude, latitude)
+        onMarkerMoved: signalList.markerMoved(longitude, latitude)
+        onMarkerDropped: signalList.changeKeyPointPosition(keyPointId, longitude, latitude)
+        onMapClicked: keyPointRequests.addKeyPoint(longitude, latitude, 0, "")
+        onMarkerClicked: root.editWaypoint(keyPointId)
+    }
+
+    // Deletes the waypoint being edited; a text field that has the keys keeps them.
+    Shortcut {
+        sequences: ["Delete", "Backspace"]
+        enabled: !root.modalOpen && root.activeWaypointId > 0
+        onActivated: keyPointRequests.deleteKeyPoint(root.activeWaypointId)
     }
 
     ProjectToolBar {
@@ -137,6 +170,15 @@ Item {
         }
         function onLanguageCBEntriesChanged() {
             root.sendHostStrings()
+        }
+    }
+
+    // A waypoint that the map view has put elsewhere, such as onto a track.
+    Connections {
+        target: host
+        ignoreUnknownSignals: true
+        function onKeyPointPositionChanged(kpId, longitude, latitude) {
+            worldMap.moveMarker(kpId, longitude, latitude)
         }
     }
 }
