@@ -3,8 +3,9 @@ import QtQuick.Controls 2.15
 import "../Theme"
 import "SignalLists"
 
-// The program's window: the map owns it, the project commands float over it, and
-// the dialogs of the map view come up in front of both.
+// The program's window: the map owns it, the project commands, the place search and
+// the settings panel float over it, and the dialogs of the map view come up in front
+// of all.
 Item {
     id: root
 
@@ -15,6 +16,7 @@ Item {
     property var waypoints: typeof keyPointItemsModel !== "undefined" ? keyPointItemsModel : null
     property var waypointSymbols: typeof keyPointImageItemsModel !== "undefined" ? keyPointImageItemsModel : null
     readonly property int activeWaypointId: waypoints ? waypoints.activeKeyPointId : 0
+    property bool settingsOpen: false
 
     readonly property var actions: host.messageBoxAction
     readonly property bool modalOpen: messageBox.visible || hintBox.visible
@@ -49,8 +51,11 @@ Item {
         id: hostStrings
     }
 
+    // Opens the panel on a waypoint, as a click on its marker does.
     function editWaypoint(keyPointId) {
         keyPointRequests.setActiveKeyPointId(keyPointId)
+        settingsPanel.showPage("keyPoint")
+        settingsOpen = true
     }
 
     SignalList {
@@ -96,6 +101,42 @@ Item {
         onMarkerClicked: root.editWaypoint(keyPointId)
     }
 
+    PlaceSearch {
+        id: placeSearch
+        objectName: "placeSearch"
+        anchors.left: toolBar.right
+        anchors.top: toolBar.top
+        anchors.leftMargin: Theme.spaceS
+        width: Math.min(Theme.searchWidth, root.width - x - Theme.spaceL)
+        enabled: !root.modalOpen
+        onPlaceChosen: {
+            keyPointRequests.addKeyPoint(coordinate.longitude, coordinate.latitude, 0, address)
+            worldMap.centerOn(coordinate)
+        }
+    }
+
+    SettingsPanel {
+        id: settingsPanel
+        objectName: "settingsPanel"
+        anchors.right: parent.right
+        anchors.top: toolBar.bottom
+        anchors.margins: Theme.spaceL
+        anchors.topMargin: Theme.spaceS
+        maximumHeight: root.height - y - Theme.spaceL
+        visible: root.settingsOpen
+        enabled: !root.modalOpen
+        waypoints: root.waypoints
+        symbols: root.waypointSymbols
+        requests: keyPointRequests
+        pathSettings: host.pathSettings
+        pathModes: host.pathMode
+        currentPathMode: host.currentPathMode
+        courseFixed: host.keyPointsFixed
+        onPathSettingsEdited: host.pathSettings = settings
+        onPathModeChosen: signalList.setPathMode(mode)
+        onCloseRequested: root.settingsOpen = false
+    }
+
     // Deletes the waypoint being edited; a text field that has the keys keeps them.
     Shortcut {
         sequences: ["Delete", "Backspace"]
@@ -110,6 +151,8 @@ Item {
         anchors.margins: Theme.spaceL
         title: host.title !== undefined ? host.title : ""
         commandsEnabled: !root.modalOpen
+        settingsPanelOpen: root.settingsOpen
+        onSettingsPanelToggled: root.settingsOpen = !root.settingsOpen
         onNewProjectRequested: root.runProjectCommand("actionNewProject", "actionSaveAndNewProject")
         onOpenProjectRequested: root.runProjectCommand("actionLoadProject", "actionSaveAndLoadProject")
         onOpenTrackRequested: root.runProjectCommand("actionLoadGPX", "actionSaveAndLoadGPX")

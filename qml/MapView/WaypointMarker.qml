@@ -6,14 +6,17 @@ MapQuickItem {
     id: marker
 
     property int keyPointId: 0
-    property alias info: symbol.info
-    property alias active: symbol.active
-    property alias hovered: symbol.hovered
+    property var info: ({})
+    property bool active: false
+    property bool hovered: false
     readonly property alias symbolItem: symbol.symbolItem
 
     anchorPoint: symbol.anchor
     z: active ? 4 : 3
     sourceItem: WaypointSymbol {
         id: symbol
+        info: marker.info
+        active: marker.active
+        hovered: marker.hovered
     }
 }

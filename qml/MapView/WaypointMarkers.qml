@@ -4,7 +4,7 @@ import QtPositioning 5.15
 // The waypoints on the map, one marker per key point, made and changed as the
 // waypoint model reports them.
 Item {
-    id: layer
+    id: markerSet
 
     property var map: null
     // The waypoint model: addMarker, insertMarker, updateMarker,
@@ -107,14 +107,14 @@ Item {
     }
 
     Connections {
-        target: layer.model
+        target: markerSet.model
         ignoreUnknownSignals: true
-        function onAddMarker(coord, keyPointInfo) { layer.add(coord, keyPointInfo) }
-        function onInsertMarker(lastMarkerId, coord, keyPointInfo) { layer.insert(lastMarkerId, coord, keyPointInfo) }
-        function onUpdateMarker(updateMarkerParam) { layer.update(updateMarkerParam) }
-        function onUpdateAllMarkersProperty(updateAllMarkersPropertyParam) { layer.updateAll(updateAllMarkersPropertyParam) }
-        function onKeyPointDeleted(kpId) { layer.remove(kpId) }
-        function onClearAllObjects() { layer.clear() }
+        function onAddMarker(coord, keyPointInfo) { markerSet.add(coord, keyPointInfo) }
+        function onInsertMarker(lastMarkerId, coord, keyPointInfo) { markerSet.insert(lastMarkerId, coord, keyPointInfo) }
+        function onUpdateMarker(updateMarkerParam) { markerSet.update(updateMarkerParam) }
+        function onUpdateAllMarkersProperty(updateAllMarkersPropertyParam) { markerSet.updateAll(updateAllMarkersPropertyParam) }
+        function onKeyPointDeleted(kpId) { markerSet.remove(kpId) }
+        function onClearAllObjects() { markerSet.clear() }
     }
 
     Component {
@@ -122,8 +122,8 @@ Item {
         WaypointMarker {
             objectName: "waypointMarker"
             // With all waypoints in the edit, all are marked.
-            active: layer.activeId === -1 || keyPointId === layer.activeId
-            hovered: keyPointId === layer.hoveredId
+            active: markerSet.activeId === -1 || keyPointId === markerSet.activeId
+            hovered: keyPointId === markerSet.hoveredId
         }
     }
 }

@@ -113,8 +113,15 @@ Item {
             onZoomLevelChanged: settle.restart()
             onBearingChanged: settle.restart()
             onTiltChanged: settle.restart()
-            onWidthChanged: settle.restart()
-            onHeightChanged: settle.restart()
+            // The map takes its new size only after its children have theirs.
+            onWidthChanged: {
+                settle.restart()
+                Qt.callLater(grid.update)
+            }
+            onHeightChanged: {
+                settle.restart()
+                Qt.callLater(grid.update)
+            }
 
             Timer {
                 id: settle
@@ -134,6 +141,7 @@ Item {
 
             // Under the route and the waypoints
             Graticule {
+                id: grid
                 anchors.fill: parent
                 z: 0.5
                 map: geoMap

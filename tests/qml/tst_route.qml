@@ -146,7 +146,11 @@ Item {
                 { tag: "deleted", steps: [["add", 1, "A"], ["add", 2, "B"], ["delete", 1], ["delete", 7]], titles: ["B"] },
                 { tag: "cleared", steps: [["add", 1, "A"], ["add", 2, "B"], ["clear"]], titles: [] },
                 { tag: "moved by the map view", steps: [["add", 1, "A"], ["moved", 1, 12.5, 47.5]], titles: ["A"],
-                  longitudes: [12.5] }
+                  longitudes: [12.5] },
+                { tag: "the one edited is marked", steps: [["add", 1, "A"], ["add", 2, "B"], ["active", 2]],
+                  titles: ["A", "B"], marked: [false, true] },
+                { tag: "all in the edit are marked", steps: [["add", 1, "A"], ["add", 2, "B"], ["active", -1]],
+                  titles: ["A", "B"], marked: [true, true] }
             ]
         }
 
@@ -160,12 +164,14 @@ Item {
                 case "delete": waypoints.keyPointDeleted(step[1]); break
                 case "clear": waypoints.clearAllObjects(); break
                 case "moved": host.keyPointPositionChanged(step[1], step[2], step[3]); break
+                case "active": waypoints.activeKeyPointId = step[1]; break
                 }
             }
             var markers = world.markerLayer.markers
             compare(markers.map(function (m) { return m.info.title }), data.titles)
             var onMap = Scene.findAll(map, "waypointMarker").filter(function (m) { return map.mapItems.indexOf(m) >= 0 })
             compare(onMap.length, data.titles.length)
+            compare(markers.map(function (m) { return m.active }), data.marked || markers.map(function () { return false }))
             for (var i = 0; i < markers.length; ++i) {
                 var caption = Scene.find(markers[i], "waypointCaption")
                 verify(caption.visible)
@@ -265,6 +271,31 @@ Item {
             host.keypointHoveredID = 3
             verify(!dot.visible, "a waypoint under the pointer wins over the route")
             compare(world.pointer.cursorShape, Qt.PointingHandCursor)
+        }
+
+        function test_deleteKey_data() {
+            return [
+                { tag: "map has the keys", key: Qt.Key_Delete, editing: false, deleted: 1 },
+                { tag: "backspace", key: Qt.Key_Backspace, editing: false, deleted: 1 },
+                { tag: "title being edited", key: Qt.Key_Delete, editing: true, deleted: 0 }
+            ]
+        }
+
+        function test_deleteKey(data) {
+            waypoints.size = 1
+            waypoints.activeItem = info(6, "Six")
+            waypoints.activeKeyPointId = 6
+            view.settingsOpen = true
+            var title = Scene.find(view, "waypointTitle")
+            tryCompare(title, "visible", true)
+            if (data.editing)
+                title.forceActiveFocus()
+            else
+                world.pointer.forceActiveFocus()
+            keyClick(data.key)
+            compare(deleteSpy.count, data.deleted)
+            if (data.deleted)
+                compare(deleteSpy.signalArguments[0][0], 6)
         }
     }
 }
