@@ -104,7 +104,6 @@ Control {
                 id: routePage
                 objectName: "routeSettingsPage"
                 width: scroll.width
-                height: implicitHeight
                 visible: scroll.page === routePage
                 onPathSettingsEdited: panel.pathSettingsEdited(settings)
                 onPathModeChosen: panel.pathModeChosen(mode)
@@ -113,7 +112,6 @@ Control {
                 id: waypointPage
                 objectName: "waypointSettingsPage"
                 width: scroll.width
-                height: implicitHeight
                 visible: scroll.page === waypointPage
                 waypoints: panel.waypoints
                 symbols: panel.symbols
