@@ -501,7 +501,7 @@
     </message>
     <message>
         <source>All waypoints</source>
-        <translation>すべてのウェイポイント</translation>
+        <translation>すべて</translation>
     </message>
     <message>
         <source>Title</source>

@@ -116,7 +116,7 @@ ColumnLayout {
         Button {
             objectName: "fontButton"
             Layout.fillWidth: true
-            flat: true
+            Material.background: Theme.paper
             font.capitalization: Font.MixedCase
             font.pixelSize: Theme.textBody
             readonly property var captionFont: page.item.keyPointFont
