@@ -109,7 +109,6 @@ Control {
                 font.pixelSize: Theme.textBody
                 onAccepted: search.find(text)
                 Keys.onEscapePressed: search.clear()
-                Keys.onDownPressed: if (results.visible) list.forceActiveFocus()
             }
             ToolBarButton {
                 objectName: "clearSearchButton"
@@ -166,6 +165,12 @@ Control {
         y: search.height + Theme.spaceXS
         width: search.width
         padding: Theme.spaceXS
+        // The keys go to the places found: arrows choose, Enter takes one.
+        focus: true
+        onOpened: {
+            list.currentIndex = 0
+            list.forceActiveFocus()
+        }
         background: Rectangle {
             radius: Theme.radius
             color: Theme.paper
@@ -177,13 +182,14 @@ Control {
             model: geocoder
             clip: true
             keyNavigationEnabled: true
+            Keys.onReturnPressed: search.choose(currentIndex)
+            Keys.onEnterPressed: search.choose(currentIndex)
             delegate: ItemDelegate {
                 width: ListView.view.width
                 text: locationData.address.text
                 font.pixelSize: Theme.textBody
                 highlighted: ListView.isCurrentItem
                 onClicked: search.choose(index)
-                Keys.onReturnPressed: search.choose(index)
             }
         }
     }

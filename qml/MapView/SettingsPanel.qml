@@ -22,8 +22,8 @@ Control {
     signal pathModeChosen(int mode)
     signal closeRequested()
 
-    // The pages shown here, by their names in the model's availableSettingsPages
-    readonly property var pageNames: ["path", "keyPoint"]
+    // Page names to ids, the model's availableSettingsPages; of these the panel
+    // shows "path" and "keyPoint".
     readonly property var pageIds: waypoints && waypoints.availableSettingsPages ? waypoints.availableSettingsPages
                                                                                  : ({ "path": 0, "keyPoint": 1 })
     // Until the model is there the panel keeps its page itself.

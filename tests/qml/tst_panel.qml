@@ -21,12 +21,14 @@ Item {
     SignalSpy { id: requestSpy }
     SignalSpy { id: pathModeSpy; signalName: "setPathMode" }
 
+    // The geocoder of the search, asking a canned answer or a port where nothing
+    // listens instead of the internet.
+    property string geocoder
     Component {
-        id: unreachableService
+        id: testService
         Plugin {
             name: "osm"
-            // Nothing listens there: the connection is refused at once.
-            PluginParameter { name: "osm.geocoding.host"; value: "http://127.0.0.1:9" }
+            PluginParameter { name: "osm.geocoding.host"; value: stage.geocoder }
         }
     }
 
@@ -213,23 +215,39 @@ Item {
             verify(find("routeSettingsPage").visible)
         }
 
-        function test_searchWithoutService() {
-            var search = find("placeSearch")
-            search.service = unreachableService
-            type(find("placeSearchField"), "Berlin")
-            var status = find("placeSearchStatus")
-            tryCompare(status, "text", "Place search needs an internet connection.", 5000)
-            verify(status.visible)
-            verify(!find("placeSearchResults").visible)
+        function test_search_data() {
+            return [
+                { tag: "offline", geocoder: "http://127.0.0.1:9", query: "Berlin",
+                  status: "Place search needs an internet connection." },
+                { tag: "nothing found", geocoder: Qt.resolvedUrl("data/nowhere"), query: "Nowhere",
+                  status: "No place found for “Nowhere”." },
+                { tag: "second place taken", geocoder: Qt.resolvedUrl("data/places"), query: "Paris", status: "",
+                  keys: [Qt.Key_Down, Qt.Key_Return], added: [-95.5555, 33.6609, 0, "Paris, Lamar County, Texas, United States"] }
+            ]
         }
 
-        function test_placeBecomesWaypoint() {
+        function test_search(data) {
+            stage.geocoder = data.geocoder
+            find("placeSearch").service = testService
             requestSpy.signalName = "addKeyPoint"
-            find("placeSearch").placeChosen(QtPositioning.coordinate(48.8566, 2.3522), "Paris, Île-de-France, France")
-            compare(requestSpy.count, 1)
-            var expected = [2.3522, 48.8566, 0, "Paris, Île-de-France, France"]
-            for (var i = 0; i < expected.length; ++i)
-                compare(requestSpy.signalArguments[0][i], expected[i])
+            type(find("placeSearchField"), data.query)
+            var status = find("placeSearchStatus")
+            var results = find("placeSearchResults")
+            if (data.added) {
+                tryCompare(results, "opened", true, 5000)
+                for (var key of data.keys)
+                    keyClick(key)
+                compare(requestSpy.count, 1)
+                for (var i = 0; i < data.added.length; ++i)
+                    compare(requestSpy.signalArguments[0][i], data.added[i])
+                var map = find("worldMap")
+                fuzzyCompare(map.center.longitude, data.added[0], 1e-6)
+                tryCompare(results, "visible", false)
+            } else {
+                tryCompare(status, "text", data.status, 5000)
+                verify(!results.visible)
+                compare(requestSpy.count, 0)
+            }
         }
     }
 }
