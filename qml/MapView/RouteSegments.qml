@@ -3,8 +3,8 @@ import "../Theme"
 
 // The drawn route: for each path segment of the waypoint model one line, and under
 // it a shadow when the route has one. Lines are made and dropped as the model
-// reports its segments; a track's segment can hold 100,000 samples, so paths go to
-// the lines whole and are never read back here.
+// reports its segments; a track's segment can hold 100,000 samples, so paths stay
+// QGeoPath values handed to the lines whole and are never turned into JS lists.
 Item {
     id: route
 
