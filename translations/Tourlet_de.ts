@@ -2,6 +2,14 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="de_DE">
 <context>
+    <name>DurationField</name>
+    <message>
+        <source>s</source>
+        <extracomment>Unit after a duration field: seconds</extracomment>
+        <translation>s</translation>
+    </message>
+</context>
+<context>
     <name>ErrorBox</name>
     <message>
         <source>Something went wrong</source>
@@ -306,6 +314,33 @@
     </message>
 </context>
 <context>
+    <name>PlaceSearch</name>
+    <message>
+        <source>Searching…</source>
+        <translation>Suche läuft…</translation>
+    </message>
+    <message>
+        <source>Place search needs an internet connection.</source>
+        <translation>Die Ortssuche braucht eine Internetverbindung.</translation>
+    </message>
+    <message>
+        <source>No place found for “%1”.</source>
+        <translation>Kein Ort gefunden für „%1“.</translation>
+    </message>
+    <message>
+        <source>The place search did not work. Try again later.</source>
+        <translation>Die Ortssuche hat nicht funktioniert. Später noch einmal versuchen.</translation>
+    </message>
+    <message>
+        <source>Search a place</source>
+        <translation>Ort suchen</translation>
+    </message>
+    <message>
+        <source>Clear the search</source>
+        <translation>Suche leeren</translation>
+    </message>
+</context>
+<context>
     <name>ProgressView</name>
     <message>
         <source>Exporting the film</source>
@@ -355,12 +390,180 @@
         <source>Full screen</source>
         <translation>Vollbild</translation>
     </message>
+    <message>
+        <source>Route and waypoints</source>
+        <translation>Route und Wegpunkte</translation>
+    </message>
+</context>
+<context>
+    <name>RouteSettingsPage</name>
+    <message>
+        <source>Straight</source>
+        <extracomment>How the route runs between waypoints: straight lines</extracomment>
+        <translation>Gerade</translation>
+    </message>
+    <message>
+        <source>Curved</source>
+        <extracomment>How the route runs between waypoints: a smooth curve</extracomment>
+        <translation>Kurvig</translation>
+    </message>
+    <message>
+        <source>Flight</source>
+        <extracomment>How the route runs between waypoints: arcs like a flight</extracomment>
+        <translation>Flug</translation>
+    </message>
+    <message>
+        <source>Route</source>
+        <extracomment>How the route runs between waypoints: as a route of straight legs, not drawn as a curve</extracomment>
+        <translation>Route</translation>
+    </message>
+    <message>
+        <source>Course</source>
+        <translation>Verlauf</translation>
+    </message>
+    <message>
+        <source>A recorded track keeps its course.</source>
+        <translation>Ein aufgezeichneter Track behält seinen Verlauf.</translation>
+    </message>
+    <message>
+        <source>Colour</source>
+        <translation>Farbe</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>Breite</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <extracomment>A width in pixels on the screen</extracomment>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Opacity</source>
+        <translation>Deckkraft</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Shadow under the route</source>
+        <translation>Schatten unter der Route</translation>
+    </message>
+    <message>
+        <source>Shadow distance</source>
+        <translation>Abstand des Schattens</translation>
+    </message>
+    <message>
+        <source>Shadow width</source>
+        <translation>Breite des Schattens</translation>
+    </message>
+    <message>
+        <source>Shadow opacity</source>
+        <translation>Deckkraft des Schattens</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPanel</name>
+    <message>
+        <source>Route</source>
+        <translation>Route</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <translation>Wegpunkt</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Schließen</translation>
+    </message>
 </context>
 <context>
     <name>ToolBarButton</name>
     <message>
         <source>%1 (%2)</source>
         <translation>%1 (%2)</translation>
+    </message>
+</context>
+<context>
+    <name>WaypointSettingsPage</name>
+    <message>
+        <source>Click a waypoint on the map to change it.</source>
+        <translation>Zum Ändern einen Wegpunkt auf der Karte anklicken.</translation>
+    </message>
+    <message>
+        <source>No waypoints yet. Click on the map to set one, or search for a place.</source>
+        <translation>Noch keine Wegpunkte. Auf die Karte klicken, um einen zu setzen, oder einen Ort suchen.</translation>
+    </message>
+    <message>
+        <source>This waypoint</source>
+        <translation>Dieser Wegpunkt</translation>
+    </message>
+    <message>
+        <source>All waypoints</source>
+        <translation>Alle Wegpunkte</translation>
+    </message>
+    <message>
+        <source>Title</source>
+        <translation>Titel</translation>
+    </message>
+    <message>
+        <source>Symbol</source>
+        <translation>Symbol</translation>
+    </message>
+    <message>
+        <source>Size</source>
+        <translation>Größe</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>A size in percent of the normal size</extracomment>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Timing</source>
+        <translation>Zeiten</translation>
+    </message>
+    <message>
+        <source>Stop at the waypoint</source>
+        <translation>Halt am Wegpunkt</translation>
+    </message>
+    <message>
+        <source>On the way to the next one</source>
+        <translation>Weg zum nächsten</translation>
+    </message>
+    <message>
+        <source>Caption</source>
+        <translation>Beschriftung</translation>
+    </message>
+    <message>
+        <source>Font: %1, %2 pt…</source>
+        <extracomment>Opens the choice of a font; %1 is the font&apos;s name, %2 its size in points</extracomment>
+        <translation>Schrift: %1, %2 pt…</translation>
+    </message>
+    <message>
+        <source>Font…</source>
+        <translation>Schrift…</translation>
+    </message>
+    <message>
+        <source>Frame behind the caption</source>
+        <translation>Rahmen hinter der Beschriftung</translation>
+    </message>
+    <message>
+        <source>Shadow under the caption</source>
+        <translation>Schatten unter der Beschriftung</translation>
+    </message>
+    <message>
+        <source>Show all waypoints</source>
+        <translation>Alle Wegpunkte zeigen</translation>
+    </message>
+    <message>
+        <source>Show this waypoint</source>
+        <translation>Diesen Wegpunkt zeigen</translation>
+    </message>
+    <message>
+        <source>Delete waypoint</source>
+        <translation>Wegpunkt löschen</translation>
     </message>
 </context>
 </TS>

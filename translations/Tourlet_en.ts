@@ -2,6 +2,14 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="en_US">
 <context>
+    <name>DurationField</name>
+    <message>
+        <source>s</source>
+        <extracomment>Unit after a duration field: seconds</extracomment>
+        <translation>s</translation>
+    </message>
+</context>
+<context>
     <name>ErrorBox</name>
     <message>
         <source>Something went wrong</source>
@@ -306,6 +314,33 @@
     </message>
 </context>
 <context>
+    <name>PlaceSearch</name>
+    <message>
+        <source>Searching…</source>
+        <translation>Searching…</translation>
+    </message>
+    <message>
+        <source>Place search needs an internet connection.</source>
+        <translation>Place search needs an internet connection.</translation>
+    </message>
+    <message>
+        <source>No place found for “%1”.</source>
+        <translation>No place found for “%1”.</translation>
+    </message>
+    <message>
+        <source>The place search did not work. Try again later.</source>
+        <translation>The place search did not work. Try again later.</translation>
+    </message>
+    <message>
+        <source>Search a place</source>
+        <translation>Search a place</translation>
+    </message>
+    <message>
+        <source>Clear the search</source>
+        <translation>Clear the search</translation>
+    </message>
+</context>
+<context>
     <name>ProgressView</name>
     <message>
         <source>Exporting the film</source>
@@ -355,12 +390,180 @@
         <source>Full screen</source>
         <translation>Full screen</translation>
     </message>
+    <message>
+        <source>Route and waypoints</source>
+        <translation>Route and waypoints</translation>
+    </message>
+</context>
+<context>
+    <name>RouteSettingsPage</name>
+    <message>
+        <source>Straight</source>
+        <extracomment>How the route runs between waypoints: straight lines</extracomment>
+        <translation>Straight</translation>
+    </message>
+    <message>
+        <source>Curved</source>
+        <extracomment>How the route runs between waypoints: a smooth curve</extracomment>
+        <translation>Curved</translation>
+    </message>
+    <message>
+        <source>Flight</source>
+        <extracomment>How the route runs between waypoints: arcs like a flight</extracomment>
+        <translation>Flight</translation>
+    </message>
+    <message>
+        <source>Route</source>
+        <extracomment>How the route runs between waypoints: as a route of straight legs, not drawn as a curve</extracomment>
+        <translation>Route</translation>
+    </message>
+    <message>
+        <source>Course</source>
+        <translation>Course</translation>
+    </message>
+    <message>
+        <source>A recorded track keeps its course.</source>
+        <translation>A recorded track keeps its course.</translation>
+    </message>
+    <message>
+        <source>Colour</source>
+        <translation>Colour</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>Width</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <extracomment>A width in pixels on the screen</extracomment>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Opacity</source>
+        <translation>Opacity</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Shadow under the route</source>
+        <translation>Shadow under the route</translation>
+    </message>
+    <message>
+        <source>Shadow distance</source>
+        <translation>Shadow distance</translation>
+    </message>
+    <message>
+        <source>Shadow width</source>
+        <translation>Shadow width</translation>
+    </message>
+    <message>
+        <source>Shadow opacity</source>
+        <translation>Shadow opacity</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPanel</name>
+    <message>
+        <source>Route</source>
+        <translation>Route</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <translation>Waypoint</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Close</translation>
+    </message>
 </context>
 <context>
     <name>ToolBarButton</name>
     <message>
         <source>%1 (%2)</source>
         <translation>%1 (%2)</translation>
+    </message>
+</context>
+<context>
+    <name>WaypointSettingsPage</name>
+    <message>
+        <source>Click a waypoint on the map to change it.</source>
+        <translation>Click a waypoint on the map to change it.</translation>
+    </message>
+    <message>
+        <source>No waypoints yet. Click on the map to set one, or search for a place.</source>
+        <translation>No waypoints yet. Click on the map to set one, or search for a place.</translation>
+    </message>
+    <message>
+        <source>This waypoint</source>
+        <translation>This waypoint</translation>
+    </message>
+    <message>
+        <source>All waypoints</source>
+        <translation>All waypoints</translation>
+    </message>
+    <message>
+        <source>Title</source>
+        <translation>Title</translation>
+    </message>
+    <message>
+        <source>Symbol</source>
+        <translation>Symbol</translation>
+    </message>
+    <message>
+        <source>Size</source>
+        <translation>Size</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>A size in percent of the normal size</extracomment>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Timing</source>
+        <translation>Timing</translation>
+    </message>
+    <message>
+        <source>Stop at the waypoint</source>
+        <translation>Stop at the waypoint</translation>
+    </message>
+    <message>
+        <source>On the way to the next one</source>
+        <translation>On the way to the next one</translation>
+    </message>
+    <message>
+        <source>Caption</source>
+        <translation>Caption</translation>
+    </message>
+    <message>
+        <source>Font: %1, %2 pt…</source>
+        <extracomment>Opens the choice of a font; %1 is the font&apos;s name, %2 its size in points</extracomment>
+        <translation>Font: %1, %2 pt…</translation>
+    </message>
+    <message>
+        <source>Font…</source>
+        <translation>Font…</translation>
+    </message>
+    <message>
+        <source>Frame behind the caption</source>
+        <translation>Frame behind the caption</translation>
+    </message>
+    <message>
+        <source>Shadow under the caption</source>
+        <translation>Shadow under the caption</translation>
+    </message>
+    <message>
+        <source>Show all waypoints</source>
+        <translation>Show all waypoints</translation>
+    </message>
+    <message>
+        <source>Show this waypoint</source>
+        <translation>Show this waypoint</translation>
+    </message>
+    <message>
+        <source>Delete waypoint</source>
+        <translation>Delete waypoint</translation>
     </message>
 </context>
 </TS>

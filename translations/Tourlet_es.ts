@@ -2,6 +2,14 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="es_ES">
 <context>
+    <name>DurationField</name>
+    <message>
+        <source>s</source>
+        <extracomment>Unit after a duration field: seconds</extracomment>
+        <translation>s</translation>
+    </message>
+</context>
+<context>
     <name>ErrorBox</name>
     <message>
         <source>Something went wrong</source>
@@ -306,6 +314,33 @@
     </message>
 </context>
 <context>
+    <name>PlaceSearch</name>
+    <message>
+        <source>Searching…</source>
+        <translation>Buscando…</translation>
+    </message>
+    <message>
+        <source>Place search needs an internet connection.</source>
+        <translation>La búsqueda de lugares necesita una conexión a Internet.</translation>
+    </message>
+    <message>
+        <source>No place found for “%1”.</source>
+        <translation>No se encontró ningún lugar para «%1».</translation>
+    </message>
+    <message>
+        <source>The place search did not work. Try again later.</source>
+        <translation>La búsqueda de lugares no ha funcionado. Vuelva a intentarlo más tarde.</translation>
+    </message>
+    <message>
+        <source>Search a place</source>
+        <translation>Buscar un lugar</translation>
+    </message>
+    <message>
+        <source>Clear the search</source>
+        <translation>Borrar la búsqueda</translation>
+    </message>
+</context>
+<context>
     <name>ProgressView</name>
     <message>
         <source>Exporting the film</source>
@@ -355,12 +390,180 @@
         <source>Full screen</source>
         <translation>Pantalla completa</translation>
     </message>
+    <message>
+        <source>Route and waypoints</source>
+        <translation>Ruta y etapas</translation>
+    </message>
+</context>
+<context>
+    <name>RouteSettingsPage</name>
+    <message>
+        <source>Straight</source>
+        <extracomment>How the route runs between waypoints: straight lines</extracomment>
+        <translation>Recto</translation>
+    </message>
+    <message>
+        <source>Curved</source>
+        <extracomment>How the route runs between waypoints: a smooth curve</extracomment>
+        <translation>Curvo</translation>
+    </message>
+    <message>
+        <source>Flight</source>
+        <extracomment>How the route runs between waypoints: arcs like a flight</extracomment>
+        <translation>Vuelo</translation>
+    </message>
+    <message>
+        <source>Route</source>
+        <extracomment>How the route runs between waypoints: as a route of straight legs, not drawn as a curve</extracomment>
+        <translation>Trayecto</translation>
+    </message>
+    <message>
+        <source>Course</source>
+        <translation>Trazado</translation>
+    </message>
+    <message>
+        <source>A recorded track keeps its course.</source>
+        <translation>Un track grabado conserva su trazado.</translation>
+    </message>
+    <message>
+        <source>Colour</source>
+        <translation>Color</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>Grosor</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <extracomment>A width in pixels on the screen</extracomment>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Opacity</source>
+        <translation>Opacidad</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Shadow under the route</source>
+        <translation>Sombra bajo la ruta</translation>
+    </message>
+    <message>
+        <source>Shadow distance</source>
+        <translation>Distancia de la sombra</translation>
+    </message>
+    <message>
+        <source>Shadow width</source>
+        <translation>Grosor de la sombra</translation>
+    </message>
+    <message>
+        <source>Shadow opacity</source>
+        <translation>Opacidad de la sombra</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPanel</name>
+    <message>
+        <source>Route</source>
+        <translation>Ruta</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <translation>Etapa</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Cerrar</translation>
+    </message>
 </context>
 <context>
     <name>ToolBarButton</name>
     <message>
         <source>%1 (%2)</source>
         <translation>%1 (%2)</translation>
+    </message>
+</context>
+<context>
+    <name>WaypointSettingsPage</name>
+    <message>
+        <source>Click a waypoint on the map to change it.</source>
+        <translation>Haga clic en una etapa del mapa para cambiarla.</translation>
+    </message>
+    <message>
+        <source>No waypoints yet. Click on the map to set one, or search for a place.</source>
+        <translation>Todavía no hay etapas. Haga clic en el mapa para añadir una o busque un lugar.</translation>
+    </message>
+    <message>
+        <source>This waypoint</source>
+        <translation>Esta etapa</translation>
+    </message>
+    <message>
+        <source>All waypoints</source>
+        <translation>Todas las etapas</translation>
+    </message>
+    <message>
+        <source>Title</source>
+        <translation>Título</translation>
+    </message>
+    <message>
+        <source>Symbol</source>
+        <translation>Símbolo</translation>
+    </message>
+    <message>
+        <source>Size</source>
+        <translation>Tamaño</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>A size in percent of the normal size</extracomment>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Timing</source>
+        <translation>Tiempos</translation>
+    </message>
+    <message>
+        <source>Stop at the waypoint</source>
+        <translation>Parada en la etapa</translation>
+    </message>
+    <message>
+        <source>On the way to the next one</source>
+        <translation>Trayecto hasta la siguiente</translation>
+    </message>
+    <message>
+        <source>Caption</source>
+        <translation>Rótulo</translation>
+    </message>
+    <message>
+        <source>Font: %1, %2 pt…</source>
+        <extracomment>Opens the choice of a font; %1 is the font&apos;s name, %2 its size in points</extracomment>
+        <translation>Fuente: %1, %2 pt…</translation>
+    </message>
+    <message>
+        <source>Font…</source>
+        <translation>Fuente…</translation>
+    </message>
+    <message>
+        <source>Frame behind the caption</source>
+        <translation>Marco detrás del rótulo</translation>
+    </message>
+    <message>
+        <source>Shadow under the caption</source>
+        <translation>Sombra bajo el rótulo</translation>
+    </message>
+    <message>
+        <source>Show all waypoints</source>
+        <translation>Mostrar todas las etapas</translation>
+    </message>
+    <message>
+        <source>Show this waypoint</source>
+        <translation>Mostrar esta etapa</translation>
+    </message>
+    <message>
+        <source>Delete waypoint</source>
+        <translation>Eliminar la etapa</translation>
     </message>
 </context>
 </TS>

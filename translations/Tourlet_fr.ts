@@ -2,6 +2,14 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="fr_FR">
 <context>
+    <name>DurationField</name>
+    <message>
+        <source>s</source>
+        <extracomment>Unit after a duration field: seconds</extracomment>
+        <translation>s</translation>
+    </message>
+</context>
+<context>
     <name>ErrorBox</name>
     <message>
         <source>Something went wrong</source>
@@ -306,6 +314,33 @@
     </message>
 </context>
 <context>
+    <name>PlaceSearch</name>
+    <message>
+        <source>Searching…</source>
+        <translation>Recherche en cours…</translation>
+    </message>
+    <message>
+        <source>Place search needs an internet connection.</source>
+        <translation>La recherche de lieux nécessite une connexion à Internet.</translation>
+    </message>
+    <message>
+        <source>No place found for “%1”.</source>
+        <translation>Aucun lieu trouvé pour « %1 ».</translation>
+    </message>
+    <message>
+        <source>The place search did not work. Try again later.</source>
+        <translation>La recherche de lieux n’a pas fonctionné. Réessayez plus tard.</translation>
+    </message>
+    <message>
+        <source>Search a place</source>
+        <translation>Rechercher un lieu</translation>
+    </message>
+    <message>
+        <source>Clear the search</source>
+        <translation>Effacer la recherche</translation>
+    </message>
+</context>
+<context>
     <name>ProgressView</name>
     <message>
         <source>Exporting the film</source>
@@ -355,12 +390,180 @@
         <source>Full screen</source>
         <translation>Plein écran</translation>
     </message>
+    <message>
+        <source>Route and waypoints</source>
+        <translation>Itinéraire et étapes</translation>
+    </message>
+</context>
+<context>
+    <name>RouteSettingsPage</name>
+    <message>
+        <source>Straight</source>
+        <extracomment>How the route runs between waypoints: straight lines</extracomment>
+        <translation>Droit</translation>
+    </message>
+    <message>
+        <source>Curved</source>
+        <extracomment>How the route runs between waypoints: a smooth curve</extracomment>
+        <translation>Courbe</translation>
+    </message>
+    <message>
+        <source>Flight</source>
+        <extracomment>How the route runs between waypoints: arcs like a flight</extracomment>
+        <translation>Vol</translation>
+    </message>
+    <message>
+        <source>Route</source>
+        <extracomment>How the route runs between waypoints: as a route of straight legs, not drawn as a curve</extracomment>
+        <translation>Trajet</translation>
+    </message>
+    <message>
+        <source>Course</source>
+        <translation>Tracé</translation>
+    </message>
+    <message>
+        <source>A recorded track keeps its course.</source>
+        <translation>Une trace enregistrée garde son tracé.</translation>
+    </message>
+    <message>
+        <source>Colour</source>
+        <translation>Couleur</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>Épaisseur</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <extracomment>A width in pixels on the screen</extracomment>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Opacity</source>
+        <translation>Opacité</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Shadow under the route</source>
+        <translation>Ombre sous l’itinéraire</translation>
+    </message>
+    <message>
+        <source>Shadow distance</source>
+        <translation>Distance de l’ombre</translation>
+    </message>
+    <message>
+        <source>Shadow width</source>
+        <translation>Épaisseur de l’ombre</translation>
+    </message>
+    <message>
+        <source>Shadow opacity</source>
+        <translation>Opacité de l’ombre</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPanel</name>
+    <message>
+        <source>Route</source>
+        <translation>Itinéraire</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <translation>Étape</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Fermer</translation>
+    </message>
 </context>
 <context>
     <name>ToolBarButton</name>
     <message>
         <source>%1 (%2)</source>
         <translation>%1 (%2)</translation>
+    </message>
+</context>
+<context>
+    <name>WaypointSettingsPage</name>
+    <message>
+        <source>Click a waypoint on the map to change it.</source>
+        <translation>Cliquez sur une étape de la carte pour la modifier.</translation>
+    </message>
+    <message>
+        <source>No waypoints yet. Click on the map to set one, or search for a place.</source>
+        <translation>Aucune étape pour l’instant. Cliquez sur la carte pour en placer une, ou recherchez un lieu.</translation>
+    </message>
+    <message>
+        <source>This waypoint</source>
+        <translation>Cette étape</translation>
+    </message>
+    <message>
+        <source>All waypoints</source>
+        <translation>Toutes les étapes</translation>
+    </message>
+    <message>
+        <source>Title</source>
+        <translation>Titre</translation>
+    </message>
+    <message>
+        <source>Symbol</source>
+        <translation>Symbole</translation>
+    </message>
+    <message>
+        <source>Size</source>
+        <translation>Taille</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>A size in percent of the normal size</extracomment>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Timing</source>
+        <translation>Durées</translation>
+    </message>
+    <message>
+        <source>Stop at the waypoint</source>
+        <translation>Arrêt à l’étape</translation>
+    </message>
+    <message>
+        <source>On the way to the next one</source>
+        <translation>Trajet jusqu’à la suivante</translation>
+    </message>
+    <message>
+        <source>Caption</source>
+        <translation>Légende</translation>
+    </message>
+    <message>
+        <source>Font: %1, %2 pt…</source>
+        <extracomment>Opens the choice of a font; %1 is the font&apos;s name, %2 its size in points</extracomment>
+        <translation>Police : %1, %2 pt…</translation>
+    </message>
+    <message>
+        <source>Font…</source>
+        <translation>Police…</translation>
+    </message>
+    <message>
+        <source>Frame behind the caption</source>
+        <translation>Cadre derrière la légende</translation>
+    </message>
+    <message>
+        <source>Shadow under the caption</source>
+        <translation>Ombre sous la légende</translation>
+    </message>
+    <message>
+        <source>Show all waypoints</source>
+        <translation>Afficher toutes les étapes</translation>
+    </message>
+    <message>
+        <source>Show this waypoint</source>
+        <translation>Afficher cette étape</translation>
+    </message>
+    <message>
+        <source>Delete waypoint</source>
+        <translation>Supprimer l’étape</translation>
     </message>
 </context>
 </TS>

@@ -2,6 +2,14 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="it_IT">
 <context>
+    <name>DurationField</name>
+    <message>
+        <source>s</source>
+        <extracomment>Unit after a duration field: seconds</extracomment>
+        <translation>s</translation>
+    </message>
+</context>
+<context>
     <name>ErrorBox</name>
     <message>
         <source>Something went wrong</source>
@@ -306,6 +314,33 @@
     </message>
 </context>
 <context>
+    <name>PlaceSearch</name>
+    <message>
+        <source>Searching…</source>
+        <translation>Ricerca in corso…</translation>
+    </message>
+    <message>
+        <source>Place search needs an internet connection.</source>
+        <translation>La ricerca di luoghi richiede una connessione a Internet.</translation>
+    </message>
+    <message>
+        <source>No place found for “%1”.</source>
+        <translation>Nessun luogo trovato per «%1».</translation>
+    </message>
+    <message>
+        <source>The place search did not work. Try again later.</source>
+        <translation>La ricerca di luoghi non ha funzionato. Riprova più tardi.</translation>
+    </message>
+    <message>
+        <source>Search a place</source>
+        <translation>Cerca un luogo</translation>
+    </message>
+    <message>
+        <source>Clear the search</source>
+        <translation>Cancella la ricerca</translation>
+    </message>
+</context>
+<context>
     <name>ProgressView</name>
     <message>
         <source>Exporting the film</source>
@@ -355,12 +390,180 @@
         <source>Full screen</source>
         <translation>Schermo intero</translation>
     </message>
+    <message>
+        <source>Route and waypoints</source>
+        <translation>Percorso e tappe</translation>
+    </message>
+</context>
+<context>
+    <name>RouteSettingsPage</name>
+    <message>
+        <source>Straight</source>
+        <extracomment>How the route runs between waypoints: straight lines</extracomment>
+        <translation>Dritto</translation>
+    </message>
+    <message>
+        <source>Curved</source>
+        <extracomment>How the route runs between waypoints: a smooth curve</extracomment>
+        <translation>Curvo</translation>
+    </message>
+    <message>
+        <source>Flight</source>
+        <extracomment>How the route runs between waypoints: arcs like a flight</extracomment>
+        <translation>Volo</translation>
+    </message>
+    <message>
+        <source>Route</source>
+        <extracomment>How the route runs between waypoints: as a route of straight legs, not drawn as a curve</extracomment>
+        <translation>Tragitto</translation>
+    </message>
+    <message>
+        <source>Course</source>
+        <translation>Andamento</translation>
+    </message>
+    <message>
+        <source>A recorded track keeps its course.</source>
+        <translation>Una traccia registrata mantiene il suo andamento.</translation>
+    </message>
+    <message>
+        <source>Colour</source>
+        <translation>Colore</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>Spessore</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <extracomment>A width in pixels on the screen</extracomment>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Opacity</source>
+        <translation>Opacità</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Shadow under the route</source>
+        <translation>Ombra sotto il percorso</translation>
+    </message>
+    <message>
+        <source>Shadow distance</source>
+        <translation>Distanza dell’ombra</translation>
+    </message>
+    <message>
+        <source>Shadow width</source>
+        <translation>Spessore dell’ombra</translation>
+    </message>
+    <message>
+        <source>Shadow opacity</source>
+        <translation>Opacità dell’ombra</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPanel</name>
+    <message>
+        <source>Route</source>
+        <translation>Percorso</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <translation>Tappa</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Chiudi</translation>
+    </message>
 </context>
 <context>
     <name>ToolBarButton</name>
     <message>
         <source>%1 (%2)</source>
         <translation>%1 (%2)</translation>
+    </message>
+</context>
+<context>
+    <name>WaypointSettingsPage</name>
+    <message>
+        <source>Click a waypoint on the map to change it.</source>
+        <translation>Fai clic su una tappa sulla mappa per modificarla.</translation>
+    </message>
+    <message>
+        <source>No waypoints yet. Click on the map to set one, or search for a place.</source>
+        <translation>Ancora nessuna tappa. Fai clic sulla mappa per aggiungerne una, oppure cerca un luogo.</translation>
+    </message>
+    <message>
+        <source>This waypoint</source>
+        <translation>Questa tappa</translation>
+    </message>
+    <message>
+        <source>All waypoints</source>
+        <translation>Tutte le tappe</translation>
+    </message>
+    <message>
+        <source>Title</source>
+        <translation>Titolo</translation>
+    </message>
+    <message>
+        <source>Symbol</source>
+        <translation>Simbolo</translation>
+    </message>
+    <message>
+        <source>Size</source>
+        <translation>Dimensione</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>A size in percent of the normal size</extracomment>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Timing</source>
+        <translation>Tempi</translation>
+    </message>
+    <message>
+        <source>Stop at the waypoint</source>
+        <translation>Sosta alla tappa</translation>
+    </message>
+    <message>
+        <source>On the way to the next one</source>
+        <translation>Tragitto fino alla successiva</translation>
+    </message>
+    <message>
+        <source>Caption</source>
+        <translation>Didascalia</translation>
+    </message>
+    <message>
+        <source>Font: %1, %2 pt…</source>
+        <extracomment>Opens the choice of a font; %1 is the font&apos;s name, %2 its size in points</extracomment>
+        <translation>Carattere: %1, %2 pt…</translation>
+    </message>
+    <message>
+        <source>Font…</source>
+        <translation>Carattere…</translation>
+    </message>
+    <message>
+        <source>Frame behind the caption</source>
+        <translation>Riquadro dietro la didascalia</translation>
+    </message>
+    <message>
+        <source>Shadow under the caption</source>
+        <translation>Ombra sotto la didascalia</translation>
+    </message>
+    <message>
+        <source>Show all waypoints</source>
+        <translation>Mostra tutte le tappe</translation>
+    </message>
+    <message>
+        <source>Show this waypoint</source>
+        <translation>Mostra questa tappa</translation>
+    </message>
+    <message>
+        <source>Delete waypoint</source>
+        <translation>Elimina la tappa</translation>
     </message>
 </context>
 </TS>

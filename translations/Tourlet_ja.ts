@@ -2,6 +2,14 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="ja_JP">
 <context>
+    <name>DurationField</name>
+    <message>
+        <source>s</source>
+        <extracomment>Unit after a duration field: seconds</extracomment>
+        <translation>秒</translation>
+    </message>
+</context>
+<context>
     <name>ErrorBox</name>
     <message>
         <source>Something went wrong</source>
@@ -306,6 +314,33 @@
     </message>
 </context>
 <context>
+    <name>PlaceSearch</name>
+    <message>
+        <source>Searching…</source>
+        <translation>検索中…</translation>
+    </message>
+    <message>
+        <source>Place search needs an internet connection.</source>
+        <translation>場所の検索にはインターネット接続が必要です。</translation>
+    </message>
+    <message>
+        <source>No place found for “%1”.</source>
+        <translation>「%1」に一致する場所は見つかりませんでした。</translation>
+    </message>
+    <message>
+        <source>The place search did not work. Try again later.</source>
+        <translation>場所を検索できませんでした。しばらくしてからもう一度お試しください。</translation>
+    </message>
+    <message>
+        <source>Search a place</source>
+        <translation>場所を検索</translation>
+    </message>
+    <message>
+        <source>Clear the search</source>
+        <translation>検索をクリア</translation>
+    </message>
+</context>
+<context>
     <name>ProgressView</name>
     <message>
         <source>Exporting the film</source>
@@ -355,12 +390,180 @@
         <source>Full screen</source>
         <translation>フルスクリーン</translation>
     </message>
+    <message>
+        <source>Route and waypoints</source>
+        <translation>ルートとウェイポイント</translation>
+    </message>
+</context>
+<context>
+    <name>RouteSettingsPage</name>
+    <message>
+        <source>Straight</source>
+        <extracomment>How the route runs between waypoints: straight lines</extracomment>
+        <translation>直線</translation>
+    </message>
+    <message>
+        <source>Curved</source>
+        <extracomment>How the route runs between waypoints: a smooth curve</extracomment>
+        <translation>曲線</translation>
+    </message>
+    <message>
+        <source>Flight</source>
+        <extracomment>How the route runs between waypoints: arcs like a flight</extracomment>
+        <translation>飛行</translation>
+    </message>
+    <message>
+        <source>Route</source>
+        <extracomment>How the route runs between waypoints: as a route of straight legs, not drawn as a curve</extracomment>
+        <translation>ルート</translation>
+    </message>
+    <message>
+        <source>Course</source>
+        <translation>経路の形</translation>
+    </message>
+    <message>
+        <source>A recorded track keeps its course.</source>
+        <translation>記録されたトラックの経路は変わりません。</translation>
+    </message>
+    <message>
+        <source>Colour</source>
+        <translation>色</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>太さ</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <extracomment>A width in pixels on the screen</extracomment>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Opacity</source>
+        <translation>不透明度</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Shadow under the route</source>
+        <translation>ルートに影を付ける</translation>
+    </message>
+    <message>
+        <source>Shadow distance</source>
+        <translation>影の距離</translation>
+    </message>
+    <message>
+        <source>Shadow width</source>
+        <translation>影の太さ</translation>
+    </message>
+    <message>
+        <source>Shadow opacity</source>
+        <translation>影の不透明度</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPanel</name>
+    <message>
+        <source>Route</source>
+        <translation>ルート</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <translation>ウェイポイント</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>閉じる</translation>
+    </message>
 </context>
 <context>
     <name>ToolBarButton</name>
     <message>
         <source>%1 (%2)</source>
         <translation>%1 (%2)</translation>
+    </message>
+</context>
+<context>
+    <name>WaypointSettingsPage</name>
+    <message>
+        <source>Click a waypoint on the map to change it.</source>
+        <translation>変更するには地図上のウェイポイントをクリックします。</translation>
+    </message>
+    <message>
+        <source>No waypoints yet. Click on the map to set one, or search for a place.</source>
+        <translation>ウェイポイントはまだありません。地図をクリックして追加するか、場所を検索してください。</translation>
+    </message>
+    <message>
+        <source>This waypoint</source>
+        <translation>このウェイポイント</translation>
+    </message>
+    <message>
+        <source>All waypoints</source>
+        <translation>すべて</translation>
+    </message>
+    <message>
+        <source>Title</source>
+        <translation>タイトル</translation>
+    </message>
+    <message>
+        <source>Symbol</source>
+        <translation>シンボル</translation>
+    </message>
+    <message>
+        <source>Size</source>
+        <translation>サイズ</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>A size in percent of the normal size</extracomment>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Timing</source>
+        <translation>時間</translation>
+    </message>
+    <message>
+        <source>Stop at the waypoint</source>
+        <translation>ウェイポイントで停止</translation>
+    </message>
+    <message>
+        <source>On the way to the next one</source>
+        <translation>次までの移動</translation>
+    </message>
+    <message>
+        <source>Caption</source>
+        <translation>ラベル</translation>
+    </message>
+    <message>
+        <source>Font: %1, %2 pt…</source>
+        <extracomment>Opens the choice of a font; %1 is the font&apos;s name, %2 its size in points</extracomment>
+        <translation>フォント: %1、%2 pt…</translation>
+    </message>
+    <message>
+        <source>Font…</source>
+        <translation>フォント…</translation>
+    </message>
+    <message>
+        <source>Frame behind the caption</source>
+        <translation>ラベルに枠を付ける</translation>
+    </message>
+    <message>
+        <source>Shadow under the caption</source>
+        <translation>ラベルに影を付ける</translation>
+    </message>
+    <message>
+        <source>Show all waypoints</source>
+        <translation>すべてのウェイポイントを表示</translation>
+    </message>
+    <message>
+        <source>Show this waypoint</source>
+        <translation>このウェイポイントを表示</translation>
+    </message>
+    <message>
+        <source>Delete waypoint</source>
+        <translation>ウェイポイントを削除</translation>
     </message>
 </context>
 </TS>

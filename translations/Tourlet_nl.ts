@@ -2,6 +2,14 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="nl_NL">
 <context>
+    <name>DurationField</name>
+    <message>
+        <source>s</source>
+        <extracomment>Unit after a duration field: seconds</extracomment>
+        <translation>s</translation>
+    </message>
+</context>
+<context>
     <name>ErrorBox</name>
     <message>
         <source>Something went wrong</source>
@@ -306,6 +314,33 @@
     </message>
 </context>
 <context>
+    <name>PlaceSearch</name>
+    <message>
+        <source>Searching…</source>
+        <translation>Bezig met zoeken…</translation>
+    </message>
+    <message>
+        <source>Place search needs an internet connection.</source>
+        <translation>Zoeken naar plaatsen vereist een internetverbinding.</translation>
+    </message>
+    <message>
+        <source>No place found for “%1”.</source>
+        <translation>Geen plaats gevonden voor ‘%1’.</translation>
+    </message>
+    <message>
+        <source>The place search did not work. Try again later.</source>
+        <translation>Het zoeken naar plaatsen is mislukt. Probeer het later opnieuw.</translation>
+    </message>
+    <message>
+        <source>Search a place</source>
+        <translation>Plaats zoeken</translation>
+    </message>
+    <message>
+        <source>Clear the search</source>
+        <translation>Zoekopdracht wissen</translation>
+    </message>
+</context>
+<context>
     <name>ProgressView</name>
     <message>
         <source>Exporting the film</source>
@@ -355,12 +390,180 @@
         <source>Full screen</source>
         <translation>Volledig scherm</translation>
     </message>
+    <message>
+        <source>Route and waypoints</source>
+        <translation>Route en routepunten</translation>
+    </message>
+</context>
+<context>
+    <name>RouteSettingsPage</name>
+    <message>
+        <source>Straight</source>
+        <extracomment>How the route runs between waypoints: straight lines</extracomment>
+        <translation>Recht</translation>
+    </message>
+    <message>
+        <source>Curved</source>
+        <extracomment>How the route runs between waypoints: a smooth curve</extracomment>
+        <translation>Gebogen</translation>
+    </message>
+    <message>
+        <source>Flight</source>
+        <extracomment>How the route runs between waypoints: arcs like a flight</extracomment>
+        <translation>Vlucht</translation>
+    </message>
+    <message>
+        <source>Route</source>
+        <extracomment>How the route runs between waypoints: as a route of straight legs, not drawn as a curve</extracomment>
+        <translation>Route</translation>
+    </message>
+    <message>
+        <source>Course</source>
+        <translation>Verloop</translation>
+    </message>
+    <message>
+        <source>A recorded track keeps its course.</source>
+        <translation>Een opgenomen track behoudt zijn verloop.</translation>
+    </message>
+    <message>
+        <source>Colour</source>
+        <translation>Kleur</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>Breedte</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <extracomment>A width in pixels on the screen</extracomment>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Opacity</source>
+        <translation>Dekking</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Shadow under the route</source>
+        <translation>Schaduw onder de route</translation>
+    </message>
+    <message>
+        <source>Shadow distance</source>
+        <translation>Afstand van de schaduw</translation>
+    </message>
+    <message>
+        <source>Shadow width</source>
+        <translation>Breedte van de schaduw</translation>
+    </message>
+    <message>
+        <source>Shadow opacity</source>
+        <translation>Dekking van de schaduw</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPanel</name>
+    <message>
+        <source>Route</source>
+        <translation>Route</translation>
+    </message>
+    <message>
+        <source>Waypoint</source>
+        <translation>Routepunt</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Sluiten</translation>
+    </message>
 </context>
 <context>
     <name>ToolBarButton</name>
     <message>
         <source>%1 (%2)</source>
         <translation>%1 (%2)</translation>
+    </message>
+</context>
+<context>
+    <name>WaypointSettingsPage</name>
+    <message>
+        <source>Click a waypoint on the map to change it.</source>
+        <translation>Klik op een routepunt op de kaart om het te wijzigen.</translation>
+    </message>
+    <message>
+        <source>No waypoints yet. Click on the map to set one, or search for a place.</source>
+        <translation>Nog geen routepunten. Klik op de kaart om er een te plaatsen, of zoek een plaats.</translation>
+    </message>
+    <message>
+        <source>This waypoint</source>
+        <translation>Dit routepunt</translation>
+    </message>
+    <message>
+        <source>All waypoints</source>
+        <translation>Alle routepunten</translation>
+    </message>
+    <message>
+        <source>Title</source>
+        <translation>Titel</translation>
+    </message>
+    <message>
+        <source>Symbol</source>
+        <translation>Symbool</translation>
+    </message>
+    <message>
+        <source>Size</source>
+        <translation>Grootte</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <extracomment>A size in percent of the normal size</extracomment>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Timing</source>
+        <translation>Tijden</translation>
+    </message>
+    <message>
+        <source>Stop at the waypoint</source>
+        <translation>Stop bij het routepunt</translation>
+    </message>
+    <message>
+        <source>On the way to the next one</source>
+        <translation>Onderweg naar het volgende</translation>
+    </message>
+    <message>
+        <source>Caption</source>
+        <translation>Bijschrift</translation>
+    </message>
+    <message>
+        <source>Font: %1, %2 pt…</source>
+        <extracomment>Opens the choice of a font; %1 is the font&apos;s name, %2 its size in points</extracomment>
+        <translation>Lettertype: %1, %2 pt…</translation>
+    </message>
+    <message>
+        <source>Font…</source>
+        <translation>Lettertype…</translation>
+    </message>
+    <message>
+        <source>Frame behind the caption</source>
+        <translation>Kader achter het bijschrift</translation>
+    </message>
+    <message>
+        <source>Shadow under the caption</source>
+        <translation>Schaduw onder het bijschrift</translation>
+    </message>
+    <message>
+        <source>Show all waypoints</source>
+        <translation>Alle routepunten tonen</translation>
+    </message>
+    <message>
+        <source>Show this waypoint</source>
+        <translation>Dit routepunt tonen</translation>
+    </message>
+    <message>
+        <source>Delete waypoint</source>
+        <translation>Routepunt verwijderen</translation>
     </message>
 </context>
 </TS>

@@ -3,13 +3,20 @@ import QtQuick.Controls 2.15
 import "../Theme"
 import "SignalLists"
 
-// The program's window: the map owns it, the project commands float over it, and
-// the dialogs of the map view come up in front of both.
+// The program's window: the map owns it, the project commands, the place search and
+// the settings panel float over it, and the dialogs of the map view come up in front
+// of all.
 Item {
     id: root
 
     width: host.windowSize && host.windowSize.width > 0 ? host.windowSize.width : 1280
     height: host.windowSize && host.windowSize.height > 0 ? host.windowSize.height : 800
+
+    // The item models come after the interface has loaded: null until then.
+    property var waypoints: typeof keyPointItemsModel !== "undefined" ? keyPointItemsModel : null
+    property var waypointSymbols: typeof keyPointImageItemsModel !== "undefined" ? keyPointImageItemsModel : null
+    readonly property int activeWaypointId: waypoints ? waypoints.activeKeyPointId : 0
+    property bool settingsOpen: false
 
     readonly property var actions: host.messageBoxAction
     readonly property bool modalOpen: messageBox.visible || hintBox.visible
@@ -44,12 +51,21 @@ Item {
         id: hostStrings
     }
 
+    // Opens the panel on a waypoint, as a click on its marker does.
+    function editWaypoint(keyPointId) {
+        keyPointRequests.setActiveKeyPointId(keyPointId)
+        settingsPanel.showPage("keyPoint")
+        settingsOpen = true
+    }
+
     SignalList {
         id: signalList
     }
     PhotoPoolSignalList {}
     AltitudePresetsSignalList {}
-    KeyPointItemsSignalList {}
+    KeyPointItemsSignalList {
+        id: keyPointRequests
+    }
     KeyPointImageItemsSignalList {}
     PilotItemsSignalList {}
     TrackingList {}
@@ -58,6 +74,7 @@ Item {
 
     WorldMap {
         id: worldMap
+        objectName: "mapStage"
         anchors.fill: parent
         locationSettings: host.locationSettings
         onViewMoved: {
@@ -68,6 +85,63 @@ Item {
             if (typeof host.setZoom === "function")
                 host.setZoom(zoomLevel)
         }
+
+        waypointModel: root.waypoints
+        pathSettings: host.pathSettings
+        activeWaypointId: root.activeWaypointId
+        hoveredWaypointId: host.keypointHoveredID
+        overRoute: host.mouseOverPath
+        routePosition: host.mouseOverPathPosition
+        keyPointsFixed: host.keyPointsFixed
+        markerLocked: host.markerLocked
+        onPointerMoved: signalList.mouseMoved(longitude, latitude)
+        onMarkerMoved: signalList.markerMoved(longitude, latitude)
+        onMarkerDropped: signalList.changeKeyPointPosition(keyPointId, longitude, latitude)
+        onMapClicked: keyPointRequests.addKeyPoint(longitude, latitude, 0, "")
+        onMarkerClicked: root.editWaypoint(keyPointId)
+    }
+
+    PlaceSearch {
+        id: placeSearch
+        objectName: "placeSearch"
+        anchors.left: toolBar.right
+        anchors.top: toolBar.top
+        anchors.leftMargin: Theme.spaceS
+        width: Math.min(Theme.searchWidth, root.width - x - Theme.spaceL)
+        enabled: !root.modalOpen
+        onPlaceChosen: {
+            keyPointRequests.addKeyPoint(coordinate.longitude, coordinate.latitude, 0, address)
+            worldMap.centerOn(coordinate)
+        }
+    }
+
+    SettingsPanel {
+        id: settingsPanel
+        objectName: "settingsPanel"
+        anchors.right: parent.right
+        anchors.top: toolBar.bottom
+        anchors.margins: Theme.spaceL
+        anchors.topMargin: Theme.spaceS
+        maximumHeight: root.height - y - Theme.spaceL
+        visible: root.settingsOpen
+        enabled: !root.modalOpen
+        waypoints: root.waypoints
+        symbols: root.waypointSymbols
+        requests: keyPointRequests
+        pathSettings: host.pathSettings
+        pathModes: host.pathMode
+        currentPathMode: host.currentPathMode
+        courseFixed: host.keyPointsFixed
+        onPathSettingsEdited: host.pathSettings = settings
+        onPathModeChosen: signalList.setPathMode(mode)
+        onCloseRequested: root.settingsOpen = false
+    }
+
+    // Deletes the waypoint being edited; a text field that has the keys keeps them.
+    Shortcut {
+        sequences: ["Delete", "Backspace"]
+        enabled: !root.modalOpen && root.activeWaypointId > 0
+        onActivated: keyPointRequests.deleteKeyPoint(root.activeWaypointId)
     }
 
     ProjectToolBar {
@@ -77,6 +151,8 @@ Item {
         anchors.margins: Theme.spaceL
         title: host.title !== undefined ? host.title : ""
         commandsEnabled: !root.modalOpen
+        settingsPanelOpen: root.settingsOpen
+        onSettingsPanelToggled: root.settingsOpen = !root.settingsOpen
         onNewProjectRequested: root.runProjectCommand("actionNewProject", "actionSaveAndNewProject")
         onOpenProjectRequested: root.runProjectCommand("actionLoadProject", "actionSaveAndLoadProject")
         onOpenTrackRequested: root.runProjectCommand("actionLoadGPX", "actionSaveAndLoadGPX")
@@ -137,6 +213,15 @@ Item {
         }
         function onLanguageCBEntriesChanged() {
             root.sendHostStrings()
+        }
+    }
+
+    // A waypoint that the map view has put elsewhere, such as onto a track.
+    Connections {
+        target: host
+        ignoreUnknownSignals: true
+        function onKeyPointPositionChanged(kpId, longitude, latitude) {
+            worldMap.moveMarker(kpId, longitude, latitude)
         }
     }
 }

@@ -11,6 +11,7 @@ Control {
     property string title
     property var languages: []
     property bool commandsEnabled: true
+    property bool settingsPanelOpen: false
 
     signal newProjectRequested()
     signal openProjectRequested()
@@ -19,6 +20,7 @@ Control {
     signal exportGpxRequested()
     signal languageChosen(int index)
     signal fullScreenRequested()
+    signal settingsPanelToggled()
 
     padding: Theme.spaceXS
     leftPadding: Theme.spaceS
@@ -74,6 +76,15 @@ Control {
             shortcut: "Ctrl+E"
             enabled: bar.commandsEnabled
             onClicked: bar.exportGpxRequested()
+        }
+        ToolBarSeparator {}
+        ToolBarButton {
+            objectName: "settingsPanelButton"
+            text: qsTr("Route and waypoints")
+            icon.source: "qrc:/Qml/images/route-settings.svg"
+            enabled: bar.commandsEnabled
+            icon.color: !enabled ? Theme.inkMuted : bar.settingsPanelOpen ? Theme.accent : Theme.ink
+            onClicked: bar.settingsPanelToggled()
         }
         ToolBarSeparator {}
         Label {

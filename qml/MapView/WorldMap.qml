@@ -4,8 +4,9 @@ import QtLocation 5.15
 import QtPositioning 5.15
 import "../Theme"
 
-// The map that fills the window. It takes its view from the map view's location
-// settings and reports where the user has moved it.
+// The map that fills the window, with the route and its waypoints. It takes its view
+// from the map view's location settings, reports where the user has moved it and
+// what the pointer does on it.
 Item {
     id: stage
 
@@ -14,8 +15,39 @@ Item {
     property var locationSettings: ({})
     readonly property alias map: mapLoader.item
 
+    // The waypoint model, null until the map view has set it
+    property var waypointModel: null
+    property var pathSettings: ({})
+    property int activeWaypointId: 0
+    // The map view's hover state (0 for no waypoint) and the place on the route
+    // next to the pointer
+    property int hoveredWaypointId: 0
+    property bool overRoute: false
+    property var routePosition: null
+    property bool keyPointsFixed: false
+    property bool markerLocked: false
+
+    readonly property var routeLayer: map ? map.routeLayer : null
+    readonly property var markerLayer: map ? map.markerLayer : null
+    readonly property var pointer: map ? map.pointer : null
+
     // Sent a moment after the user has stopped moving the map.
     signal viewMoved(var center, real zoomLevel, var topLeft, var bottomRight, real hitRadius)
+    signal pointerMoved(double longitude, double latitude)
+    signal markerMoved(double longitude, double latitude)
+    signal markerDropped(int keyPointId, double longitude, double latitude)
+    signal mapClicked(double longitude, double latitude)
+    signal markerClicked(int keyPointId)
+
+    function moveMarker(keyPointId, longitude, latitude) {
+        if (markerLayer)
+            markerLayer.move(keyPointId, longitude, latitude)
+    }
+
+    function centerOn(coordinate) {
+        if (map)
+            map.center = coordinate
+    }
 
     function applyLocationSettings() {
         var m = mapLoader.item
@@ -43,7 +75,7 @@ Item {
         onLoaded: stage.applyLocationSettings()
 
         sourceComponent: Map {
-            id: map
+            id: geoMap
             objectName: "worldMap"
             color: Theme.mapBackground
             copyrightsVisible: false
@@ -69,12 +101,27 @@ Item {
                 return supportedMapTypes[0]
             }
 
+            property alias routeLayer: routeLayer
+            property alias markerLayer: markerLayer
+            property alias pointer: pointer
+
+            // The pointer pans the map itself, so that a drag can move a waypoint
+            // instead; the wheel still zooms.
+            gesture.acceptedGestures: MapGestureArea.PinchGesture
+
             onCenterChanged: settle.restart()
             onZoomLevelChanged: settle.restart()
             onBearingChanged: settle.restart()
             onTiltChanged: settle.restart()
-            onWidthChanged: settle.restart()
-            onHeightChanged: settle.restart()
+            // The map takes its new size only after its children have theirs.
+            onWidthChanged: {
+                settle.restart()
+                Qt.callLater(grid.update)
+            }
+            onHeightChanged: {
+                settle.restart()
+                Qt.callLater(grid.update)
+            }
 
             Timer {
                 id: settle
@@ -82,21 +129,61 @@ Item {
                 onTriggered: {
                     // The hit radius for the pointer: what a finger's width on the
                     // screen measures on the ground.
-                    var c = Qt.point(map.width / 2, map.height / 2)
-                    var metres = map.toCoordinate(c, false).distanceTo(
-                                map.toCoordinate(Qt.point(c.x + 12, c.y), false))
-                    stage.viewMoved(map.center, map.zoomLevel,
-                                    map.toCoordinate(Qt.point(0, 0), false),
-                                    map.toCoordinate(Qt.point(map.width, map.height), false),
+                    var c = Qt.point(geoMap.width / 2, geoMap.height / 2)
+                    var metres = geoMap.toCoordinate(c, false).distanceTo(
+                                geoMap.toCoordinate(Qt.point(c.x + 12, c.y), false))
+                    stage.viewMoved(geoMap.center, geoMap.zoomLevel,
+                                    geoMap.toCoordinate(Qt.point(0, 0), false),
+                                    geoMap.toCoordinate(Qt.point(geoMap.width, geoMap.height), false),
                                     metres)
                 }
             }
-        }
-    }
 
-    Graticule {
-        anchors.fill: parent
-        map: mapLoader.item
-        visible: map !== null && map.bearing === 0 && map.tilt === 0
+            // Under the route and the waypoints
+            Graticule {
+                id: grid
+                anchors.fill: parent
+                z: 0.5
+                map: geoMap
+                visible: geoMap.bearing === 0 && geoMap.tilt === 0
+            }
+
+            RouteSegments {
+                id: routeLayer
+                map: geoMap
+                model: stage.waypointModel
+                pathSettings: stage.pathSettings
+            }
+
+            WaypointMarkers {
+                id: markerLayer
+                map: geoMap
+                model: stage.waypointModel
+                activeId: stage.activeWaypointId
+                hoveredId: stage.hoveredWaypointId > 0 ? stage.hoveredWaypointId : pointer.symbolUnderPointer
+            }
+
+            RouteHoverDot {
+                objectName: "routeHoverDot"
+                coordinate: stage.routePosition && stage.routePosition.isValid ? stage.routePosition
+                                                                               : QtPositioning.coordinate()
+                visible: stage.overRoute && stage.hoveredWaypointId <= 0 && !pointer.draggingMarker
+            }
+
+            MapPointer {
+                id: pointer
+                map: geoMap
+                markers: markerLayer
+                hoveredId: stage.hoveredWaypointId
+                keyPointsFixed: stage.keyPointsFixed
+                markerLocked: stage.markerLocked
+                routePosition: stage.routePosition
+                onPointerMoved: stage.pointerMoved(longitude, latitude)
+                onMarkerMoved: stage.markerMoved(longitude, latitude)
+                onMarkerDropped: stage.markerDropped(keyPointId, longitude, latitude)
+                onMapClicked: stage.mapClicked(longitude, latitude)
+                onMarkerClicked: stage.markerClicked(keyPointId)
+            }
+        }
     }
 }

@@ -17,6 +17,15 @@ QtObject {
     readonly property color scrim: "#401F2A30"
     readonly property color mapBackground: "#DCE6E8"
     readonly property color gridLine: "#C2D1D5"
+    // The dark copy of the route under it, and the one under a caption
+    readonly property color routeShadow: "#000000"
+    readonly property color captionShadow: "#99000000"
+
+    // Choices offered for the route and for captions
+    readonly property var routeColors: ["#FF0000", "#E8710A", "#F2C200", "#2E9E44",
+                                        "#1A73E8", "#7B3FB5", "#1F2A30", "#FFFFFF"]
+    readonly property var captionColors: ["#000000", "#FFFFFF", "#C4553B", "#B3261E",
+                                          "#2E9E44", "#1A73E8", "#7B3FB5", "#5E6A71"]
 
     // Spacing scale, in pixels
     readonly property int spaceXS: 4
@@ -36,4 +45,15 @@ QtObject {
     readonly property int iconSize: 24
     readonly property int controlSize: 40
     readonly property int dialogWidth: 440
+    readonly property int panelWidth: 328
+    readonly property int searchWidth: 280
+    readonly property int swatchSize: 28
+    readonly property int symbolTileSize: 52
+
+    // On the map: a waypoint symbol at size 1, the dot that follows the pointer on
+    // the route, and the ring around the waypoint being edited
+    readonly property int markerSize: 48
+    readonly property int hoverDotSize: 14
+    readonly property int highlightWidth: 3
+    readonly property real disabledOpacity: 0.4
 }

@@ -1,4 +1,5 @@
 import QtQuick 2.15
+import QtPositioning 5.15
 
 // Stands in for the map view: the properties, slots and signals the interface uses,
 // with counters where the tests need to see a call.
@@ -19,6 +20,18 @@ QtObject {
                                       "actionOpenWindowsSettings": 1014 })
     property var languageCBEntries: [{ "title": "strDEde", "selected": 0 },
                                      { "title": "strENen", "selected": 1 }]
+
+    // Route and hover state
+    property var pathSettings: ({ "color": "#FF0000", "opacity": 0.8, "width": 6, "shadowEnabled": false,
+                                  "shadowDistance": 3, "shadowWidth": 6, "shadowOpacity": 0.8 })
+    property var pathMode: ({ "line": 0, "curve": 1, "airplane": 2, "route": 3 })
+    property int currentPathMode: 1
+    property bool keyPointsFixed: false
+    property bool markerLocked: false
+    property bool mouseOverPath: false
+    property var mouseOverPathPosition: QtPositioning.coordinate()
+    property int keypointHoveredID: 0
+    signal keyPointPositionChanged(int kpId, double longitude, double latitude)
 
     property var strHostStrings: ({})
     property int stringWrites: 0

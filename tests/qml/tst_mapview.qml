@@ -1,5 +1,6 @@
 import QtQuick 2.15
 import QtTest 1.15
+import "Scene.js" as Scene
 
 // The window's own logic: which action each answer of a box reports, the questions
 // before leaving a modified project, the modal wait state and its replacement by an
@@ -20,24 +21,8 @@ Item {
 
         property var view: null
 
-        // Searches items, popups and their content for an object name.
         function find(object, name) {
-            if (!object)
-                return null
-            if (object.objectName === name)
-                return object
-            var next = []
-            var list = object.data !== undefined ? object.data : object.children
-            for (var i = 0; list && i < list.length; ++i)
-                next.push(list[i])
-            if (object.contentItem && next.indexOf(object.contentItem) < 0)
-                next.push(object.contentItem)
-            for (var j = 0; j < next.length; ++j) {
-                var found = find(next[j], name)
-                if (found)
-                    return found
-            }
-            return null
+            return Scene.find(object, name)
         }
 
         function press(name) {
