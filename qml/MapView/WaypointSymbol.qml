@@ -16,7 +16,9 @@ Item {
     property bool hovered: false
 
     // Where the waypoint lies inside this item: the bottom centre of the symbol.
-    readonly property point anchor: Qt.point(symbol.x + symbol.width / 2, symbol.y + symbol.height)
+    // The plain dot is centred on the waypoint instead.
+    readonly property point anchor: Qt.point(symbol.x + symbol.width / 2,
+                                             symbol.y + symbol.height - (source === "" ? symbol.height / 2 : 0))
     readonly property alias symbolItem: symbol
 
     readonly property real scaleFactor: info.size > 0 ? info.size : 1
@@ -46,7 +48,8 @@ Item {
         id: symbol
         objectName: "waypointSymbol"
         width: Math.round(Theme.markerSize * waypoint.scaleFactor * (waypoint.hovered ? 1.1 : 1))
-        height: width
+        // The plain marker is a dot: the caption stands right above it.
+        height: waypoint.source === "" ? Math.round(width / 3) : width
         x: (waypoint.width - width) / 2
         y: caption.height
 

@@ -79,26 +79,10 @@ Item {
             objectName: "worldMap"
             color: Theme.mapBackground
             copyrightsVisible: false
-            // Tiles come from the program alone, never from the network: the only map
-            // type used is the custom one, whose tiles are looked up in the resource.
-            // Where none is found the map shows its ground colour.
+            // No tiles and no network: the ground colour, the grid and what the
+            // program draws on the map.
             plugin: Plugin {
-                name: "osm"
-                PluginParameter {
-                    name: "osm.mapping.providersrepository.disabled"
-                    value: true
-                }
-                PluginParameter {
-                    name: "osm.mapping.custom.host"
-                    value: "qrc:/Qml/maptiles/"
-                }
-            }
-            activeMapType: {
-                for (var i = 0; i < supportedMapTypes.length; ++i) {
-                    if (supportedMapTypes[i].style === MapType.CustomMap)
-                        return supportedMapTypes[i]
-                }
-                return supportedMapTypes[0]
+                name: "itemsoverlay"
             }
 
             property alias routeLayer: routeLayer

@@ -427,6 +427,7 @@ void MapView::openFile(const QString &fileName)
 
 void MapView::startLoad(const QString &fileName)
 {
+    m_loading = true;
     m_projectFileName = fileName;
     m_mainController.newProject();
     resetViews();
@@ -448,6 +449,7 @@ void MapView::delayedLoadProjectFinish()
     if (!m_mainController.loadFile(m_projectFileName, isProject)) {
         // The wait state stays up until the next load or new project replaces it.
         emit showError(m_mainController.getString(QStringLiteral("strErrorCantLoadProject")));
+        m_loading = false;
         update();
         return;
     }
@@ -490,6 +492,7 @@ void MapView::delayedLoadProjectFinish()
 
     updateSceneSize();
     emit keyPointsFixedChanged();
+    m_loading = false;
     emit hideWaitState();
 
     const QFileInfo file(m_projectFileName);

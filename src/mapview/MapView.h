@@ -441,6 +441,9 @@ private:
     bool m_animationRunning = false;
     bool m_showOverlays = true;
     bool m_debugInfoActive = false;
+    // From the start of a load to its end the map still shows the old view; what it
+    // reports of it then would overwrite the view of the loaded file.
+    bool m_loading = false;
 
     QKeyPointItemsModel m_keyPointItemsModel;
     QKeyPointImageItemsModel m_keyPointImageItemsModel;

@@ -209,11 +209,15 @@ void MapView::changeKeyPointPosition(int kpId, double longitude, double latitude
 
 void MapView::setCenterPosition(double latitude, double longitude)
 {
+    if (m_loading)
+        return;
     m_document->fields().centerPosition = geoPoint(longitude, latitude);
 }
 
 void MapView::saveBoundaries(double longitudeTL, double latitudeTL, double longitudeBR, double latitudeBR)
 {
+    if (m_loading)
+        return;
     ProjectFields &fields = m_document->fields();
     fields.visibleBoundariesTL = geoPoint(longitudeTL, latitudeTL);
     fields.visibleBoundariesBR = geoPoint(longitudeBR, latitudeBR);
@@ -223,6 +227,8 @@ void MapView::saveBoundaries(double longitudeTL, double latitudeTL, double longi
 
 void MapView::setZoom(double current)
 {
+    if (m_loading)
+        return;
     logTrace(0, QStringLiteral("setZoomLevel = %f"), current);
     m_document->fields().currentZoomLevel = current;
     setMouseOverPath(false);
@@ -231,6 +237,8 @@ void MapView::setZoom(double current)
 
 void MapView::setCurrentTilt(double current)
 {
+    if (m_loading)
+        return;
     logTrace(0, QStringLiteral("setCurrentTilt %f"), current);
     if (m_document->fields().currentTilt != current) {
         m_document->fields().currentTilt = current;

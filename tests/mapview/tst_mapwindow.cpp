@@ -3,6 +3,7 @@
 #include "mapview/MapView.h"
 #include "project/PainterPathRenderer_Controller.h"
 
+#include <QGeoCoordinate>
 #include <QQuickItem>
 #include <QResource>
 #include <QSettings>
@@ -43,9 +44,18 @@ private slots:
 
     void interfaceHandsOverItsStrings();
     void trackOpensOnTheMap();
+    void clickOnTheMapAddsAWaypointThatASaveKeeps();
     void failedLoadShowsTheErrorBox();
 
 private:
+    // Items of the map's scene with this object name that are on the map.
+    int onMap(const char *name) const
+    {
+        QObject *map = m_view->rootObject()->findChild<QObject *>("worldMap");
+        const auto items = map ? map->property("mapItems").value<QList<QObject *>>() : QList<QObject *>();
+        return int(std::count_if(items.begin(), items.end(),
+                                 [name](const QObject *item) { return item->objectName() == QLatin1String(name); }));
+    }
     // A popup of the interface is up.
     bool shown(const char *name) const
     {
@@ -124,7 +134,13 @@ void tst_MapWindow::trackOpensOnTheMap()
     QObject *map = m_view->rootObject()->findChild<QObject *>("worldMap");
     QVERIFY(map);
     QTRY_COMPARE(map->property("zoomLevel").toDouble(), m_view->currentZoomLevel());
-    QVERIFY(m_view->currentZoomLevel() > 10.0);
+    QVERIFY2(m_view->currentZoomLevel() > 10.0, qPrintable(QString::number(m_view->currentZoomLevel())));
+
+    // The route and its waypoints are drawn: a line per segment, a marker per key point.
+    const Path &path = *m_document.pathManager().active();
+    QVERIFY(path.keyPoints.size() >= 2);
+    QCOMPARE(onMap("routeSegment"), int(path.pathSegments.size()));
+    QCOMPARE(onMap("waypointMarker"), int(path.keyPoints.size()));
 }
 
 void tst_MapWindow::failedLoadShowsTheErrorBox()
@@ -138,6 +154,46 @@ void tst_MapWindow::failedLoadShowsTheErrorBox()
     QVERIFY2(!text.isEmpty() && text != QLatin1String("strErrorCantLoadProject"), qPrintable(text));
     QTRY_VERIFY(shown("errorBox"));
     QVERIFY(!shown("waitState"));
+}
+
+void tst_MapWindow::clickOnTheMapAddsAWaypointThatASaveKeeps()
+{
+    // Saves go where the test says.
+    class SaveHere : public FileDialogs
+    {
+    public:
+        explicit SaveHere(QString name) : m_name(std::move(name)) {}
+        QString openFileName(const QString &, const QString &, const QString &) override { return QString(); }
+        QString saveFileName(const QString &, const QString &, const QString &) override { return m_name; }
+
+    private:
+        QString m_name;
+    };
+    const QString projectFile = m_dir.filePath(QStringLiteral("clicked.zkgeo"));
+    m_view->mainController().setFileDialogs(std::make_unique<SaveHere>(projectFile));
+    m_view->triggerMessageBoxAction(m_view->mainController().action(QStringLiteral("actionNewProject")));
+    QTRY_COMPARE(onMap("waypointMarker"), 0);
+
+    QObject *map = m_view->rootObject()->findChild<QObject *>("worldMap");
+    auto *mapItem = qobject_cast<QQuickItem *>(map);
+    QVERIFY(mapItem);
+    const QPoint spot = mapItem->mapToScene(QPointF(mapItem->width() * 0.4, mapItem->height() * 0.6)).toPoint();
+    QTest::mouseMove(m_view.get(), spot);
+    QTest::mouseClick(m_view.get(), Qt::LeftButton, Qt::NoModifier, spot);
+    QTRY_COMPARE(onMap("waypointMarker"), 1);
+
+    QGeoCoordinate clicked;
+    QVERIFY(QMetaObject::invokeMethod(map, "toCoordinate", Q_RETURN_ARG(QGeoCoordinate, clicked),
+                                      Q_ARG(QPointF, mapItem->mapFromScene(spot)), Q_ARG(bool, false)));
+    QVERIFY(m_view->projectModified());
+    QVERIFY(m_view->saveProject());
+
+    PainterPathRenderer_Controller reopened;
+    QVERIFY(bool(reopened.LoadProject(projectFile)));
+    const std::vector<KeyPoint> saved = reopened.pathManager().keyPoints();
+    QCOMPARE(saved.size(), size_t(1));
+    QVERIFY2(QGeoCoordinate(saved[0].latitude, saved[0].longitude).distanceTo(clicked) < 1.0,
+             qPrintable(QStringLiteral("%1 %2").arg(saved[0].latitude).arg(saved[0].longitude)));
 }
 
 QTEST_MAIN(tst_MapWindow)

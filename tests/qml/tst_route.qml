@@ -193,7 +193,14 @@ Item {
 
         function test_click(data) {
             addMarker(5, "Five", 11.58, 48.14)
-            var symbol = world.markerLayer.markerById(5).symbolItem
+            var marker = world.markerLayer.markerById(5)
+            var symbol = marker.symbolItem
+            // The map places its items when it next lays them out.
+            tryVerify(function () {
+                var at = map.fromCoordinate(QtPositioning.coordinate(48.14, 11.58), false)
+                return Math.abs(marker.x + marker.anchorPoint.x - at.x) < 1
+                        && Math.abs(marker.y + marker.anchorPoint.y - at.y) < 1
+            })
             var point = data.at === "symbol" ? symbol.mapToItem(map, symbol.width / 2, symbol.height / 2)
                                              : Qt.point(200, 600)
             host.keypointHoveredID = data.hovered

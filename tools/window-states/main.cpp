@@ -5,6 +5,7 @@
 
 #include <QApplication>
 #include <QCursor>
+#include <QGeoCoordinate>
 #include <QDir>
 #include <QQuickItem>
 #include <QQuickStyle>
@@ -22,7 +23,11 @@
 // the other through the same slots and clicks the user's actions reach, and saves
 // what the map view shows as "<name>.png".
 //
-//   window-states OUTPUT_FOLDER TRACK_FILE
+//   window-states OUTPUT_FOLDER TRACK_FILE [STATE...]
+//   window-states --list
+//
+// Content ids count on through a process, as in a run of the program: a state that
+// relies on them (the default waypoint symbol) wants a process of its own.
 
 namespace {
 
@@ -69,6 +74,28 @@ public:
         QTest::mouseClick(&view(), Qt::LeftButton, Qt::NoModifier, centre.toPoint());
     }
 
+    // A short route through three towns, seen whole, with the second one chosen and
+    // the settings panel open on `page`.
+    bool editRoute(int page) const
+    {
+        QKeyPointItemsModel &waypoints = view().keyPointItemsModel();
+        waypoints.addKeyPoint(8.3093, 47.0502, 0.0, QStringLiteral("Lucerne, Switzerland"));
+        waypoints.addKeyPoint(8.5155, 47.1662, 0.0, QStringLiteral("Zug"));
+        waypoints.addKeyPoint(8.5417, 47.3769, 0.0, QStringLiteral("Zurich"));
+        const Path *path = document().pathManager().active();
+        if (!path || path->keyPoints.size() != 3)
+            return false;
+        waypoints.setActiveKeyPointId(int(path->keyPoints[1].id));
+        waypoints.setCurrentSettingsPage(page);
+        QObject *map = find("worldMap");
+        if (!map)
+            return false;
+        map->setProperty("center", QVariant::fromValue(QGeoCoordinate(47.21, 8.50)));
+        map->setProperty("zoomLevel", 10.2);
+        view().rootObject()->setProperty("settingsOpen", true);
+        return true;
+    }
+
     bool openFile(const QString &fileName) const
     {
         QSignalSpy done(&view(), &MapView::hideWaitState);
@@ -107,12 +134,14 @@ int main(int argc, char *argv[])
 {
     QApplication app(argc, argv);
     const QStringList arguments = QCoreApplication::arguments();
-    if (arguments.size() != 3) {
-        err() << "usage: window-states OUTPUT_FOLDER TRACK_FILE\n";
+    if (arguments.size() < 2 || (arguments[1] != QLatin1String("--list") && arguments.size() < 3)) {
+        err() << "usage: window-states OUTPUT_FOLDER TRACK_FILE [STATE...] | window-states --list\n";
         return 2;
     }
     const QDir output(arguments[1]);
-    const QString track = QFileInfo(arguments[2]).absoluteFilePath();
+    const QString track = arguments.size() > 2 ? QFileInfo(arguments[2]).absoluteFilePath() : QString();
+    // Named states only; all without names.
+    const QStringList chosen = arguments.mid(3);
     QTemporaryDir scratch;
     const QString damaged = scratch.filePath(QStringLiteral("notes.gpx"));
     {
@@ -136,6 +165,15 @@ int main(int argc, char *argv[])
     const QList<State> states = {
         {"window", [](Stage &) { return true; }},
         {"track", [&](Stage &s) { return s.openFile(track); }},
+        {"waypoint-edit", [](Stage &s) { return s.editRoute(KeyPointItemsData::KeyPointPage); }},
+        {"route-settings",
+         [](Stage &s) {
+             QVariantMap style = s.view().pathSettings();
+             style[QStringLiteral("shadowEnabled")] = true;
+             style[QStringLiteral("color")] = QStringLiteral("#1565C0");
+             s.view().writePathSettings(style);
+             return s.editRoute(KeyPointItemsData::PathPage);
+         }},
         {"close-question",
          [](Stage &s) {
              s.view().projectIsModified();
@@ -170,8 +208,17 @@ int main(int argc, char *argv[])
          }},
     };
 
+    if (arguments[1] == QLatin1String("--list")) {
+        QTextStream out(stdout);
+        for (const State &state : states)
+            out << state.name << "\n";
+        return 0;
+    }
+
     int failures = 0;
     for (const State &state : states) {
+        if (!chosen.isEmpty() && !chosen.contains(QLatin1String(state.name)))
+            continue;
         translators.install(LanguageTable::English);
         Stage stage;
         const QString fileName = output.filePath(QString::fromLatin1(state.name) + QStringLiteral(".png"));
