@@ -194,6 +194,16 @@ void tst_MapWindow::clickOnTheMapAddsAWaypointThatASaveKeeps()
     QCOMPARE(saved.size(), size_t(1));
     QVERIFY2(QGeoCoordinate(saved[0].latitude, saved[0].longitude).distanceTo(clicked) < 1.0,
              qPrintable(QStringLiteral("%1 %2").arg(saved[0].latitude).arg(saved[0].longitude)));
+
+    // Opened again, the project shows its waypoint under its title.
+    m_view->triggerMessageBoxAction(m_view->mainController().action(QStringLiteral("actionNewProject")));
+    QTRY_COMPARE(onMap("waypointMarker"), 0);
+    m_view->openFile(projectFile);
+    QVERIFY(waitForLoad());
+    QTRY_COMPARE(onMap("waypointMarker"), 1);
+    QCOMPARE(m_view->keyPointItemsModel().rowCount(), 1);
+    QCOMPARE(m_view->keyPointItemsModel().data(m_view->keyPointItemsModel().index(0, 0), Qt::UserRole + 1).toString(),
+             saved[0].title());
 }
 
 QTEST_MAIN(tst_MapWindow)
