@@ -1,6 +1,6 @@
 #include "models/QKeyPointImageItemsModel.h"
 
-QKeyPointImageItemsModel::QKeyPointImageItemsModel(QObject *parent) : QAbstractItemModel(parent) {}
+QKeyPointImageItemsModel::QKeyPointImageItemsModel(QObject *parent) : FlatListModel(parent) {}
 
 void QKeyPointImageItemsModel::setData(KeyPointImageItems *items)
 {
@@ -18,26 +18,9 @@ void QKeyPointImageItemsModel::refill(const std::vector<WaypointItem> &waypoints
     endResetModel();
 }
 
-QModelIndex QKeyPointImageItemsModel::index(int row, int column, const QModelIndex &parent) const
-{
-    if (parent.isValid() || column != 0 || row < 0 || row >= rowCount())
-        return QModelIndex();
-    return createIndex(row, column);
-}
-
-QModelIndex QKeyPointImageItemsModel::parent(const QModelIndex &) const
-{
-    return QModelIndex();
-}
-
 int QKeyPointImageItemsModel::rowCount(const QModelIndex &parent) const
 {
     return parent.isValid() || !m_items ? 0 : m_items->size();
-}
-
-int QKeyPointImageItemsModel::columnCount(const QModelIndex &parent) const
-{
-    return parent.isValid() ? 0 : 1;
 }
 
 QVariant QKeyPointImageItemsModel::data(const QModelIndex &index, int role) const

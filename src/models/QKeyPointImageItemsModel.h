@@ -1,12 +1,11 @@
 #pragma once
 
+#include "models/FlatListModel.h"
 #include "models/KeyPointImageItems.h"
-
-#include <QAbstractItemModel>
 
 // The waypoint symbol list for the interface. The list itself belongs to the
 // key point data; this model only shows it.
-class QKeyPointImageItemsModel : public QAbstractItemModel
+class QKeyPointImageItemsModel : public FlatListModel
 {
     Q_OBJECT
 
@@ -20,10 +19,7 @@ public:
     // Fills the list anew, once the catalogue is loaded.
     void refill(const std::vector<WaypointItem> &waypoints, const QString &browseTitle);
 
-    QModelIndex index(int row, int column, const QModelIndex &parent = QModelIndex()) const override;
-    QModelIndex parent(const QModelIndex &child) const override;
     int rowCount(const QModelIndex &parent = QModelIndex()) const override;
-    int columnCount(const QModelIndex &parent = QModelIndex()) const override;
     QVariant data(const QModelIndex &index, int role) const override;
     QHash<int, QByteArray> roleNames() const override;
 

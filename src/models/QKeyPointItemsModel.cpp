@@ -49,7 +49,7 @@ int methodIndexByName(const QMetaObject *meta, QMetaMethod::MethodType type, con
 
 } // namespace
 
-QKeyPointItemsModel::QKeyPointItemsModel(QObject *parent) : QAbstractItemModel(parent)
+QKeyPointItemsModel::QKeyPointItemsModel(QObject *parent) : FlatListModel(parent)
 {
     qRegisterMetaType<QGeoPath>();
     qRegisterMetaType<QGeoCoordinate>();
@@ -86,26 +86,9 @@ void QKeyPointItemsModel::connectSignalList(QObject *root)
     }
 }
 
-QModelIndex QKeyPointItemsModel::index(int row, int column, const QModelIndex &parent) const
-{
-    if (parent.isValid() || column != 0 || row < 0 || row >= rowCount())
-        return QModelIndex();
-    return createIndex(row, column);
-}
-
-QModelIndex QKeyPointItemsModel::parent(const QModelIndex &) const
-{
-    return QModelIndex();
-}
-
 int QKeyPointItemsModel::rowCount(const QModelIndex &parent) const
 {
     return parent.isValid() || !m_data ? 0 : m_data->rowCount();
-}
-
-int QKeyPointItemsModel::columnCount(const QModelIndex &parent) const
-{
-    return parent.isValid() ? 0 : 1;
 }
 
 QVariant QKeyPointItemsModel::data(const QModelIndex &index, int role) const

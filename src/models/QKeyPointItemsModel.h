@@ -1,8 +1,8 @@
 #pragma once
 
+#include "models/FlatListModel.h"
 #include "models/KeyPointItemsData.h"
 
-#include <QAbstractItemModel>
 #include <QColor>
 #include <QGeoCoordinate>
 #include <QGeoPath>
@@ -17,7 +17,7 @@
 // dataChanged, sizeChanged, addMarker, then addPathSegment (appended) or
 // insertPathSegment and pathSegmentChanged of the new segment (inserted), then
 // pathChanged and pathSegmentChanged of every other segment whose samples changed.
-class QKeyPointItemsModel : public QAbstractItemModel
+class QKeyPointItemsModel : public FlatListModel
 {
     Q_OBJECT
     Q_PROPERTY(QVariantMap availableSettingsPages READ availableSettingsPages CONSTANT)
@@ -74,10 +74,7 @@ public:
     bool allKeyPointsEnabledState() const;
     int size() const { return rowCount(); }
 
-    QModelIndex index(int row, int column, const QModelIndex &parent = QModelIndex()) const override;
-    QModelIndex parent(const QModelIndex &child) const override;
     int rowCount(const QModelIndex &parent = QModelIndex()) const override;
-    int columnCount(const QModelIndex &parent = QModelIndex()) const override;
     QVariant data(const QModelIndex &index, int role) const override;
     QHash<int, QByteArray> roleNames() const override;
 
