@@ -292,23 +292,23 @@ private slots:
     void trackPathKeepsItsCurve()
     {
         PainterPathRenderer_Controller doc;
-        Path &path = doc.pathManager().activeChecked();
-        path.pathType = PathType::GPX;
-        path.curveMode = CurveMode::Straight;
+        Path &route = doc.pathManager().activeChecked();
+        route.pathType = PathType::GPX;
+        route.curveMode = CurveMode::Straight;
         for (int i = 0; i < 50; ++i)
-            path.addCurvePoint(8.0 + i * 0.001234567891234, 50.0 + std::sin(i) * 0.01, 100 + i);
-        KeyPoint first(path.curvePoints.front().x, path.curvePoints.front().y, 100);
-        KeyPoint last(path.curvePoints.back().x, path.curvePoints.back().y, 149);
-        path.addKeyPoint(first, false);
-        path.addKeyPoint(last, false);
-        path.curvePoints.front().correspondingKeyPoint = path.keyPoints[0].id;
-        path.curvePoints.back().correspondingKeyPoint = path.keyPoints[1].id;
-        path.pathSegments[0].curvePoints = path.curvePoints;
-        MediaPoint media(path.curvePoints[10].x, path.curvePoints[10].y, 0);
-        path.addMediaPoint(media, 0, false);
-        QCOMPARE(path.curvePoints[10].correspondingMediaPoint, path.mediaPoints[0].id);
+            route.addCurvePoint(8.0 + i * 0.001234567891234, 50.0 + std::sin(i) * 0.01, 100 + i);
+        KeyPoint first(route.curvePoints.front().x, route.curvePoints.front().y, 100);
+        KeyPoint last(route.curvePoints.back().x, route.curvePoints.back().y, 149);
+        route.addKeyPoint(first, false);
+        route.addKeyPoint(last, false);
+        route.curvePoints.front().correspondingKeyPoint = route.keyPoints[0].id;
+        route.curvePoints.back().correspondingKeyPoint = route.keyPoints[1].id;
+        route.pathSegments[0].curvePoints = route.curvePoints;
+        MediaPoint media(route.curvePoints[10].x, route.curvePoints[10].y, 0);
+        route.addMediaPoint(media, 0, false);
+        QCOMPARE(route.curvePoints[10].correspondingMediaPoint, route.mediaPoints[0].id);
 
-        const QString file = path_(QStringLiteral("track.zkgeo"));
+        const QString file = path(QStringLiteral("track.zkgeo"));
         QVERIFY(saveDocumentFile(doc, file));
         PainterPathRenderer_Controller back;
         QCOMPARE(int(openDocumentFile(back, file).status), int(DocumentOpenResult::Status::Project));
@@ -317,8 +317,8 @@ private slots:
         QVERIFY(q.isFixedTrack());
         QCOMPARE(q.curvePoints.size(), size_t(50));
         for (size_t i = 0; i < 50; ++i)
-            QVERIFY(q.curvePoints[i].x == path.curvePoints[i].x && q.curvePoints[i].y == path.curvePoints[i].y
-                    && q.curvePoints[i].z == path.curvePoints[i].z);
+            QVERIFY(q.curvePoints[i].x == route.curvePoints[i].x && q.curvePoints[i].y == route.curvePoints[i].y
+                    && q.curvePoints[i].z == route.curvePoints[i].z);
         // References come back as ids of the loaded points.
         QCOMPARE(q.curvePoints.front().correspondingKeyPoint, q.keyPoints[0].id);
         QCOMPARE(q.curvePoints.back().correspondingKeyPoint, q.keyPoints[1].id);
@@ -332,7 +332,7 @@ private slots:
         plain.pathManager().activeChecked().addKeyPoint(1, 2, 0, QString(), false);
         plain.pathManager().activeChecked().addKeyPoint(3, 4, 0, QString(), true);
         QVERIFY(!plain.pathManager().activeChecked().curvePoints.empty());
-        const QString plainFile = path_(QStringLiteral("plain.zkgeo"));
+        const QString plainFile = path(QStringLiteral("plain.zkgeo"));
         QVERIFY(saveDocumentFile(plain, plainFile));
         QVERIFY(!readBytes(plainFile).contains("[curvepoint"));
         QVERIFY(readBytes(file).contains("[curvepoint49]"));
@@ -341,31 +341,31 @@ private slots:
     void photosKeepTheirPlacesOnAnOrdinaryRoute()
     {
         PainterPathRenderer_Controller doc;
-        Path &path = doc.pathManager().activeChecked();
-        path.curveMode = CurveMode::Smooth;
+        Path &route = doc.pathManager().activeChecked();
+        route.curveMode = CurveMode::Smooth;
         const double coords[][2] = {{2.35, 48.85}, {4.83, 45.76}, {5.37, 43.30}};
         for (int i = 0; i < 3; ++i)
-            path.addKeyPoint(coords[i][0], coords[i][1], 0, QString(), i == 2);
-        MediaPoint onKey(path.keyPoints[1].x, path.keyPoints[1].y, 0);
-        path.addMediaPoint(onKey, path.keyPoints[1].id, false);
-        MediaPoint midLeg(path.curvePoints[100].x, path.curvePoints[100].y, 0);
-        path.addMediaPoint(midLeg, 0, false);
+            route.addKeyPoint(coords[i][0], coords[i][1], 0, QString(), i == 2);
+        MediaPoint onKey(route.keyPoints[1].x, route.keyPoints[1].y, 0);
+        route.addMediaPoint(onKey, route.keyPoints[1].id, false);
+        MediaPoint midLeg(route.curvePoints[100].x, route.curvePoints[100].y, 0);
+        route.addMediaPoint(midLeg, 0, false);
         auto placeOf = [](const Path &p, size_t media) {
             for (size_t i = 0; i < p.curvePoints.size(); ++i)
                 if (p.curvePoints[i].correspondingMediaPoint == p.mediaPoints[media].id)
                     return int(i);
             return -1;
         };
-        const int keyPlace = placeOf(path, 0);
+        const int keyPlace = placeOf(route, 0);
         QVERIFY(keyPlace > 100);
-        QCOMPARE(placeOf(path, 1), 100);
+        QCOMPARE(placeOf(route, 1), 100);
 
-        const QString file = path_(QStringLiteral("photos.zkgeo"));
+        const QString file = path(QStringLiteral("photos.zkgeo"));
         QVERIFY(saveDocumentFile(doc, file));
         PainterPathRenderer_Controller back;
         QCOMPARE(int(openDocumentFile(back, file).status), int(DocumentOpenResult::Status::Project));
         const Path &q = back.pathManager().activeChecked();
-        QCOMPARE(q.curvePoints.size(), path.curvePoints.size());
+        QCOMPARE(q.curvePoints.size(), route.curvePoints.size());
         QCOMPARE(q.mediaPoints.size(), size_t(2));
         QCOMPARE(placeOf(q, 0), keyPlace);
         QCOMPARE(placeOf(q, 1), 100);
@@ -763,9 +763,6 @@ private slots:
                 QCOMPARE(after.value(name), before.value(name));
         }
     }
-
-private:
-    QString path_(const QString &name) const { return path(name); }
 };
 
 QTEST_GUILESS_MAIN(TestDocument)
