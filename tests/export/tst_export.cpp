@@ -204,14 +204,6 @@ private slots:
         QCOMPARE(ExportWorker::exportSize(1279), QSize(1280, 720)); // 79 sixteenths is odd: rounds up to 80
         QVERIFY(ExportWorker::exportSize(15).isEmpty());
         QVERIFY(ExportWorker::exportSize(-5).isEmpty());
-
-        // The height argument plays no part; the encoder gets the derived size.
-        const QString file = path(QStringLiteral("größe 1000.mp4"));
-        QVERIFY(exportFilm(file, true, 3, QSize(1000, 123)));
-        const QVariantMap p = probe(file);
-        QCOMPARE(p.value("width").toInt(), 992);
-        QCOMPARE(p.value("height").toInt(), 558);
-        QCOMPARE(p.value("nb_read_frames").toInt(), 3);
     }
 
     void film_data()
@@ -256,6 +248,7 @@ private slots:
         QCOMPARE(QDir(m_dir.path()).entryList({QFileInfo(file).fileName() + QStringLiteral(".*")}), QStringList());
     }
 
+    // The encoder gets the size derived from the width, whatever the height.
     void otherAspectIsStretchedToFill()
     {
         // 4:3 frame: a green band over the top quarter, red left half, blue right half.
@@ -266,8 +259,9 @@ private slots:
             p.fillRect(200, 0, 200, 300, blue);
             p.fillRect(0, 0, 400, 75, green);
         };
-        const QString file = path(QStringLiteral("stretch.mp4"));
+        const QString file = path(QStringLiteral("größe 400.mp4"));
         QVERIFY(exportFilm(file, true, 2, QSize(400, 300), paint));
+        QCOMPARE(probe(file).value("height").toInt(), 234);
         const QVector<QImage> pictures = decode(file, QSize(416, 234));
         QCOMPARE(pictures.size(), 2);
         const QImage &f = pictures.first();
