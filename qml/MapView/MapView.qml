@@ -15,12 +15,21 @@ Item {
     // The item models come after the interface has loaded: null until then.
     property var waypoints: typeof keyPointItemsModel !== "undefined" ? keyPointItemsModel : null
     property var waypointSymbols: typeof keyPointImageItemsModel !== "undefined" ? keyPointImageItemsModel : null
+    property var avatars: typeof pilotItemsModel !== "undefined" ? pilotItemsModel : null
     readonly property int activeWaypointId: waypoints ? waypoints.activeKeyPointId : 0
     property bool settingsOpen: false
 
     readonly property var actions: host.messageBoxAction
     readonly property bool modalOpen: messageBox.visible || hintBox.visible
                                       || errorBox.visible || waitState.visible
+
+    readonly property bool playing: host.animationRunning === true
+    readonly property int cameraMode: host.currentAnimationMode !== undefined ? host.currentAnimationMode : 0
+
+    // The corners of the map's view, which the fly-in fits the route into.
+    function visibleRegion() {
+        return worldMap.visibleRegion()
+    }
 
     // The id of a message-box action by name; "actionNone" for a name the table lacks.
     function action(name) {
@@ -99,6 +108,43 @@ Item {
         onMarkerDropped: signalList.changeKeyPointPosition(keyPointId, longitude, latitude)
         onMapClicked: keyPointRequests.addKeyPoint(longitude, latitude, 0, "")
         onMarkerClicked: root.editWaypoint(keyPointId)
+
+        playing: root.playing
+        animationCamera: host.animationCamera
+        avatarPose: host.avatarPose
+        pilot: root.avatars ? root.avatars.currentPilot : ({})
+        waypointPopDuration: host.animateKeyPoints ? host.keyPointAnimationDuration * 500 : 0
+    }
+
+    FilmFrame {
+        id: filmFrame
+        objectName: "filmFrame"
+        anchors.fill: worldMap
+        readonly property var frames: host.animationFrames || []
+        readonly property var chosen: frames[host.currentAnimationFrame] || frames[0]
+        visible: root.playing && (root.cameraMode === 2 || root.cameraMode === 3) && maskSource !== ""
+        maskSource: chosen ? chosen.sourceFileName : ""
+    }
+
+    // What the film asks of the map at each event: the waypoints reached, and the
+    // next picture of an animated avatar.
+    Connections {
+        target: host
+        ignoreUnknownSignals: true
+        property int lastPosition: -1
+        function onAnimationEventChanged() {
+            var event = host.animationEvent
+            if (event.type === "start") {
+                lastPosition = -1
+                signalList.resetAnimationLoop()
+            }
+            if (event.stepAnimatedPilot === true)
+                ++worldMap.pilotStep
+            if (event.pathPosition !== undefined && event.pathPosition > lastPosition) {
+                lastPosition = event.pathPosition
+                signalList.setCurrentAnimationPosition(event.pathPosition)
+            }
+        }
     }
 
     PlaceSearch {

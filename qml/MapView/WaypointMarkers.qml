@@ -12,6 +12,10 @@ Item {
     property var model: null
     property int activeId: 0
     property int hoveredId: 0
+    // While the film plays a waypoint shows once the avatar has reached it, popping
+    // up over popDuration milliseconds.
+    property bool playing: false
+    property int popDuration: 0
 
     // The markers in the order of the route
     property var markers: []
@@ -123,7 +127,9 @@ Item {
             objectName: "waypointMarker"
             // With all waypoints in the edit, all are marked.
             active: markerSet.activeId === -1 || keyPointId === markerSet.activeId
-            hovered: keyPointId === markerSet.hoveredId
+            hovered: !markerSet.playing && keyPointId === markerSet.hoveredId
+            playing: markerSet.playing
+            popDuration: markerSet.popDuration
         }
     }
 }

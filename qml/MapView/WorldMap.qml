@@ -27,6 +27,18 @@ Item {
     property bool keyPointsFixed: false
     property bool markerLocked: false
 
+    // The film: while it plays the camera follows host.animationCamera, the avatar
+    // travels and the waypoints appear as it reaches them; editing rests.
+    property bool playing: false
+    property var animationCamera: ({})
+    property var avatarPose: ({})
+    property var pilot: ({})
+    property int pilotStep: 0
+    // Waypoints pop up over this many milliseconds as the avatar reaches them; 0: at once.
+    property int waypointPopDuration: 0
+    // Movement glides over one film frame; the export wants each frame exact.
+    property bool glide: true
+
     readonly property var routeLayer: map ? map.routeLayer : null
     readonly property var markerLayer: map ? map.markerLayer : null
     readonly property var pointer: map ? map.pointer : null
@@ -49,9 +61,19 @@ Item {
             map.center = coordinate
     }
 
-    function applyLocationSettings() {
+    // [longitude, latitude] of the top-left and bottom-right corner of the view
+    function visibleRegion() {
+        if (!map)
+            return []
+        var tl = map.toCoordinate(Qt.point(0, 0), false)
+        var br = map.toCoordinate(Qt.point(map.width, map.height), false)
+        if (!tl.isValid || !br.isValid)
+            return []
+        return [tl.longitude, tl.latitude, br.longitude, br.latitude]
+    }
+
+    function applyView(s) {
         var m = mapLoader.item
-        var s = locationSettings
         if (!m || !s)
             return
         if (isFinite(s.centerLatitude) && isFinite(s.centerLongitude))
@@ -64,7 +86,15 @@ Item {
             m.tilt = s.tilt
     }
 
+    function applyLocationSettings() {
+        applyView(locationSettings)
+    }
+
     onLocationSettingsChanged: applyLocationSettings()
+    onAnimationCameraChanged: {
+        if (playing)
+            applyView(animationCamera)
+    }
 
     // The map item wants a window from its first moment on, so it is made once the
     // stage stands in one.
@@ -92,6 +122,11 @@ Item {
             // The pointer pans the map itself, so that a drag can move a waypoint
             // instead; the wheel still zooms.
             gesture.acceptedGestures: MapGestureArea.PinchGesture
+
+            Behavior on center {
+                enabled: stage.playing && stage.glide
+                CoordinateAnimation { duration: 30 }
+            }
 
             onCenterChanged: settle.restart()
             onZoomLevelChanged: settle.restart()
@@ -143,20 +178,33 @@ Item {
                 id: markerLayer
                 map: geoMap
                 model: stage.waypointModel
-                activeId: stage.activeWaypointId
+                playing: stage.playing
+                popDuration: stage.waypointPopDuration
+                activeId: stage.playing ? 0 : stage.activeWaypointId
                 hoveredId: stage.hoveredWaypointId > 0 ? stage.hoveredWaypointId : pointer.symbolUnderPointer
+            }
+
+            AvatarMarker {
+                objectName: "avatarMarker"
+                visible: stage.playing && place.isValid
+                pilot: stage.pilot
+                pose: stage.avatarPose
+                mapBearing: geoMap.bearing
+                step: stage.pilotStep
+                glide: stage.glide
             }
 
             RouteHoverDot {
                 objectName: "routeHoverDot"
                 coordinate: stage.routePosition && stage.routePosition.isValid ? stage.routePosition
                                                                                : QtPositioning.coordinate()
-                visible: stage.overRoute && stage.hoveredWaypointId <= 0 && !pointer.draggingMarker
+                visible: stage.overRoute && stage.hoveredWaypointId <= 0 && !pointer.draggingMarker && !stage.playing
             }
 
             MapPointer {
                 id: pointer
                 map: geoMap
+                enabled: !stage.playing
                 markers: markerLayer
                 hoveredId: stage.hoveredWaypointId
                 keyPointsFixed: stage.keyPointsFixed

@@ -20,6 +20,8 @@ QtObject {
     // The dark copy of the route under it, and the one under a caption
     readonly property color routeShadow: "#000000"
     readonly property color captionShadow: "#99000000"
+    // Around the map in the two crop modes of the film
+    readonly property color filmFrame: "#1F2A30"
 
     // Choices offered for the route and for captions
     readonly property var routeColors: ["#FF0000", "#E8710A", "#F2C200", "#2E9E44",

@@ -71,8 +71,12 @@ QString filmTime(int32_t frames, double position)
 } // namespace
 
 MapView::MapView(PainterPathRenderer_Controller *document, QWindow *parent, const AppSettings &settings)
-    : QQuickView(parent), m_mainController(document, settings), m_document(document)
+    : QQuickView(parent), m_mainController(document, settings), m_document(document),
+      m_animationSource(*document), m_eventList(m_animationSource), m_playback(m_eventList, m_animationSource)
 {
+    connect(&m_playback, &PlaybackLoop::animationEventChanged, this, &MapView::showPlaybackEvent);
+    connect(&m_playback, &PlaybackLoop::activeKeyPointReached, this, &MapView::setActiveKeyPointId);
+    connect(&m_playback, &PlaybackLoop::endShown, this, &MapView::playbackEndShown);
 }
 
 MapView::~MapView() = default;
@@ -141,6 +145,7 @@ void MapView::initLists()
              imageRoot);
     m_keyPointImageItemsModel.setData(&m_mainController.keyPointData().imageItems());
     m_keyPointImageItemsModel.refill(catalogue.waypoints(), browseTitle());
+    rebuildAnimationFrames();
 }
 
 QString MapView::browseTitle() const
@@ -173,6 +178,8 @@ void MapView::connectSignalList(QObject *signalList)
     static const Row rows[] = {
         {"saveProject()", nullptr},
         {"setPathMode(int)", nullptr},
+        {"setAnimationMode(int)", nullptr},
+        {"setAnimationFrame(int)", nullptr},
         {"ignorePauseOnKeyPoint(bool)", nullptr},
         {"setShowKeyPointsAtPosition(bool)", nullptr},
         {"setAnimateKeyPoints(bool)", nullptr},
@@ -181,6 +188,11 @@ void MapView::connectSignalList(QObject *signalList)
         {"setMoveDistance(double)", nullptr},
         {"setCenterPosition(double,double)", nullptr},
         {"saveBoundaries(double,double,double,double)", nullptr},
+        {"setTimelinePosition(double)", nullptr},
+        {"startAnimation()", nullptr},
+        {"resetAnimationLoop()", nullptr},
+        {"stopAnimation(bool)", nullptr},
+        {"setCurrentAnimationPosition(int)", nullptr},
         {"changeKeyPointPosition(int,double,double)", nullptr},
         {"resetPhotoDrop()", nullptr},
         {"setShowCompass(bool)", nullptr},
@@ -371,6 +383,8 @@ void MapView::showTutorial()
 
 void MapView::newProjectCommand()
 {
+    if (m_animationRunning)
+        stopAnimation(false);
     m_mainController.newProject();
     resetViews();
 }
@@ -427,6 +441,8 @@ void MapView::openFile(const QString &fileName)
 
 void MapView::startLoad(const QString &fileName)
 {
+    if (m_animationRunning)
+        stopAnimation(false);
     m_loading = true;
     m_projectFileName = fileName;
     m_mainController.newProject();
@@ -480,8 +496,7 @@ void MapView::delayedLoadProjectFinish()
         if (!isProject) {
             fields.currentZoomLevel = fittedZoom(oldExtent, extent(), int(fields.currentZoomLevel));
             rebuildLocationSettings();
-            DocumentAnimationSource source(*m_document);
-            AnimationEventList(source).updateDuration();
+            m_eventList.updateDuration();
             emit animationDurationChanged();
             emit animationDurationAsStringChanged();
             emit timeLinePositionAsStringChanged();

@@ -1,6 +1,11 @@
 #pragma once
 
+#include "animation/AnimationEventList.h"
+#include "animation/PlaybackCamera.h"
+#include "animation/PlaybackLoop.h"
+#include "animation/VisibleRegionProvider.h"
 #include "mapview/QMainController.h"
+#include "project/DocumentAnimationSource.h"
 #include "models/QKeyPointImageItemsModel.h"
 #include "models/QKeyPointItemsModel.h"
 
@@ -13,12 +18,13 @@
 
 class PainterPathRenderer_Controller;
 class QKeyEvent;
+class QMouseEvent;
 class QWidget;
 
 // The map stage and the object the interface talks to: QML reaches it as the
 // context property "host". It carries out the project commands, publishes the
 // document as properties and forwards the interface's requests to the document.
-class MapView : public QQuickView
+class MapView : public QQuickView, private VisibleRegionProvider
 {
     Q_OBJECT
 
@@ -77,6 +83,13 @@ class MapView : public QQuickView
     Q_PROPERTY(bool animateKeyPoints READ animateKeyPoints NOTIFY animateKeyPointsChanged)
     Q_PROPERTY(bool animationRunning READ animationRunning NOTIFY animationRunningChanged)
     Q_PROPERTY(QVariantMap animationEvent READ animationEvent NOTIFY animationEventChanged)
+    // Where the avatar of the current event stands: "valid", "longitude", "latitude",
+    // "heading" (degrees clockwise from north)
+    Q_PROPERTY(QVariantMap avatarPose READ avatarPose NOTIFY animationEventChanged)
+    // The map's view for the current event, with the keys of locationSettings
+    Q_PROPERTY(QVariantMap animationCamera READ animationCamera NOTIFY animationEventChanged)
+    // The chosen share 0..1 of the longest film
+    Q_PROPERTY(double animationDurationPerc READ animationDurationPerc NOTIFY animationDurationChanged)
     Q_PROPERTY(bool linearAnimationDuration READ linearAnimationDuration NOTIFY linearAnimationDurationChanged)
     Q_PROPERTY(bool flyInAnimation READ flyInAnimation NOTIFY flyInAnimationChanged)
     Q_PROPERTY(bool showOverlays READ showOverlays NOTIFY showOverlaysChanged)
@@ -189,6 +202,13 @@ public:
     bool animateKeyPoints() const;
     bool animationRunning() const { return m_animationRunning; }
     QVariantMap animationEvent() const { return m_animationEvent; }
+    QVariantMap avatarPose() const { return m_avatarPose; }
+    QVariantMap animationCamera() const { return m_animationCamera; }
+    double animationDurationPerc() const;
+    PlaybackLoop &playback() { return m_playback; }
+    const AnimationEventList &animationEvents() const { return m_eventList; }
+    // Set by the exporter while it runs: a click or Control+Space leave the film alone.
+    void setExportRunning(bool running) { m_exportRunning = running; }
     bool linearAnimationDuration() const;
     bool flyInAnimation() const;
     bool showOverlays() const { return m_showOverlays; }
@@ -280,6 +300,27 @@ public slots:
     void setCurrentTilt(double current);
     void resetPhotoDrop();
 
+    // Playback
+    void startAnimation();
+    void stopAnimation(bool clicked);
+    void killAnimation();
+    void resetAnimationLoop();
+    void setCurrentAnimationPosition(int nArrayIndex);
+    void setTimelinePosition(double position);
+    void setAnimationDurationPerc(double perc);
+    void setAnimationMode(int mode);
+    void setAnimationFrame(int index);
+    void setKeyPointAnimationDuration(int value);
+    void slotLinearAnimationDuration(bool state);
+    void slotFlyInAnimation(bool state);
+    void setEnableFlyInRotation(bool state);
+    void setEnableFlyInTilt(bool state);
+    void setFlyInDuration(int seconds);
+    void setFlyInEndTilt(int degrees);
+    void setFlyInStartRotation(int degrees);
+    // The frame-accurate step of the export.
+    void stepAnimation();
+
 signals:
     // Towards the top-level window
     void closeApp();
@@ -370,8 +411,15 @@ signals:
 
 protected:
     void keyPressEvent(QKeyEvent *event) override;
+    void mouseReleaseEvent(QMouseEvent *event) override;
 
 private:
+    bool visibleRegion(GeoRect &region) const override;
+    void seekToEnd();
+    // The event that playback has reached: pose, camera and timeline follow it.
+    void showPlaybackEvent();
+    void playbackEndShown();
+    void rebuildAnimationFrames();
     void connectSignalList(QObject *signalList);
     // The content catalogue and the lists made from it, then the waypoint models.
     void initLists();
@@ -447,4 +495,14 @@ private:
 
     QKeyPointItemsModel m_keyPointItemsModel;
     QKeyPointImageItemsModel m_keyPointImageItemsModel;
+
+    DocumentAnimationSource m_animationSource;
+    AnimationEventList m_eventList;
+    PlaybackLoop m_playback;
+    PlaybackCamera m_playbackCamera;
+    QVariantMap m_avatarPose;
+    QVariantMap m_animationCamera;
+    // The heading of the avatar looks this many metres along the route.
+    double m_headingSpan = 50.0;
+    bool m_exportRunning = false;
 };

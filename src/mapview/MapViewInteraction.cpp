@@ -209,14 +209,14 @@ void MapView::changeKeyPointPosition(int kpId, double longitude, double latitude
 
 void MapView::setCenterPosition(double latitude, double longitude)
 {
-    if (m_loading)
+    if (m_loading || m_animationRunning)
         return;
     m_document->fields().centerPosition = geoPoint(longitude, latitude);
 }
 
 void MapView::saveBoundaries(double longitudeTL, double latitudeTL, double longitudeBR, double latitudeBR)
 {
-    if (m_loading)
+    if (m_loading || m_animationRunning)
         return;
     ProjectFields &fields = m_document->fields();
     fields.visibleBoundariesTL = geoPoint(longitudeTL, latitudeTL);
@@ -227,7 +227,7 @@ void MapView::saveBoundaries(double longitudeTL, double latitudeTL, double longi
 
 void MapView::setZoom(double current)
 {
-    if (m_loading)
+    if (m_loading || m_animationRunning)
         return;
     logTrace(0, QStringLiteral("setZoomLevel = %f"), current);
     m_document->fields().currentZoomLevel = current;
@@ -237,7 +237,7 @@ void MapView::setZoom(double current)
 
 void MapView::setCurrentTilt(double current)
 {
-    if (m_loading)
+    if (m_loading || m_animationRunning)
         return;
     logTrace(0, QStringLiteral("setCurrentTilt %f"), current);
     if (m_document->fields().currentTilt != current) {
@@ -262,6 +262,12 @@ void MapView::keyPressEvent(QKeyEvent *event)
 {
     if (event->key() == Qt::Key_Escape)
         leaveFullscreen();
+    if (event->key() == Qt::Key_Space && (event->modifiers() & Qt::ControlModifier) && !m_exportRunning) {
+        if (m_animationRunning)
+            stopAnimation(true);
+        else
+            startAnimation();
+    }
     advanceDebugKeys(event);
     QQuickView::keyPressEvent(event);
 }

@@ -1,6 +1,7 @@
 #include "animation/AnimationEventList.h"
 #include "animation/EventListBuilder.h"
 #include "animation/PlainAnimationSource.h"
+#include "TestRoutes.h"
 
 #include <QFile>
 #include <QSet>
@@ -12,43 +13,6 @@
 namespace {
 
 using Type = AnimationEvent::Type;
-
-// A track-like path whose samples are laid by hand along the equator, so that
-// every leg has exactly `samplesPerLeg` samples: key point i is named by sample
-// i * samplesPerLeg, the last one by the very last sample.
-void layRoute(PlainAnimationSource &source, const std::vector<double> &keyLongitudes, int samplesPerLeg)
-{
-    Path &path = source.paths.activeChecked();
-    path.pathType = PathType::GPX;
-    path.fixedCurve = true;
-    for (double lon : keyLongitudes)
-        path.addKeyPoint(KeyPoint(lon, 0.0, 0.0), false);
-    for (size_t i = 0; i + 1 < keyLongitudes.size(); ++i) {
-        for (int j = 0; j < samplesPerLeg; ++j) {
-            const double x = keyLongitudes[i] + (keyLongitudes[i + 1] - keyLongitudes[i]) * j / samplesPerLeg;
-            CurvePoint sample(x, 0.0, 0.0);
-            if (j == 0)
-                sample.correspondingKeyPoint = path.keyPoints[i].id;
-            path.curvePoints.push_back(sample);
-        }
-    }
-    if (!keyLongitudes.empty()) {
-        CurvePoint last(keyLongitudes.back(), 0.0, 0.0);
-        last.correspondingKeyPoint = path.keyPoints.back().id;
-        path.curvePoints.push_back(last);
-    }
-}
-
-// Puts a media point with these photographs on a sample.
-void placeMedia(PlainAnimationSource &source, size_t sample, const QStringList &files, const QList<int> &orientations = {})
-{
-    Path &path = source.paths.activeChecked();
-    MediaPoint media(path.curvePoints[sample].x, path.curvePoints[sample].y, 0.0);
-    for (int i = 0; i < files.size(); ++i)
-        media.properties.imageSources.push_back({files[i], orientations.value(i)});
-    path.curvePoints[sample].correspondingMediaPoint = media.id;
-    path.mediaPoints.push_back(media);
-}
 
 // Timeline computed, then the stretch pinned to 1 so that a 3000 ms leg is 90 frames.
 bool buildPinned(PlainAnimationSource &source, AnimationEventList &list)

@@ -165,6 +165,21 @@ int main(int argc, char *argv[])
     const QList<State> states = {
         {"window", [](Stage &) { return true; }},
         {"track", [&](Stage &s) { return s.openFile(track); }},
+        {"playback",
+         [&](Stage &s) {
+             if (!s.openFile(track))
+                 return false;
+             s.view().setAnimationMode(1);
+             s.view().startAnimation();
+             QTest::qWait(6000);
+             err() << "DEBUG camera " << QVariant(s.view().animationCamera()).toString() << " "
+                   << s.view().animationCamera().value("centerLongitude").toDouble() << " pose "
+                   << s.view().avatarPose().value("longitude").toDouble() << " map "
+                   << s.find("worldMap")->property("center").value<QGeoCoordinate>().longitude()
+                   << " playing " << s.find("mapStage")->property("playing").toBool() << "\n";
+             err().flush();
+             return s.view().animationRunning();
+         }},
         {"waypoint-edit", [](Stage &s) { return s.editRoute(KeyPointItemsData::KeyPointPage); }},
         {"route-settings",
          [](Stage &s) {
