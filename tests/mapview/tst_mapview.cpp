@@ -108,6 +108,7 @@ private slots:
     void pointerHover_data();
     void pointerHover();
     void trackMarkerSlidesBetweenLockedEnds();
+    void previewStopsOnClickAndRestoresTheView();
 };
 
 void tst_MapView::messageBoxActions_data()
@@ -466,3 +467,46 @@ void tst_MapView::trackMarkerSlidesBetweenLockedEnds()
 
 QTEST_MAIN(tst_MapView)
 #include "tst_mapview.moc"
+
+void tst_MapView::previewStopsOnClickAndRestoresTheView()
+{
+    Stage stage;
+    stage.view.openFile(writeTestFile(stage.dir, QStringLiteral("ride.gpx"), ride));
+    QVERIFY(stage.waitForLoad());
+    ProjectFields &fields = stage.document.fields();
+    fields.flyInEnabled = true;
+    fields.currentZoomLevel = 16.0;
+    fields.currentBearing = 10.0;
+    // The view, larger than the ride, as the map reported it.
+    stage.document.setViewBoundaries(KeyPoint(13.66, 51.11, 0.0), KeyPoint(13.76, 51.01, 0.0));
+    stage.view.setAnimationMode(1);
+
+    // Control+Space plays; the fly-in zooms out to the whole ride first.
+    QKeyEvent play(QEvent::KeyPress, Qt::Key_Space, Qt::ControlModifier);
+    QCoreApplication::sendEvent(&stage.view, &play);
+    QVERIFY(stage.view.animationRunning());
+    QVERIFY(fields.currentZoomLevel < 16.0);
+    QTRY_COMPARE(stage.view.animationEvent().value(QStringLiteral("type")).toString(), QStringLiteral("flyin"));
+    QVERIFY(stage.view.avatarPose().value(QStringLiteral("valid")).toBool());
+    QVERIFY(stage.view.animationCamera().value(QStringLiteral("zoomLevel")).toDouble() < 16.0);
+
+    // Neither a click nor the keys stop the film while an export runs.
+    QMouseEvent release(QEvent::MouseButtonRelease, QPointF(5, 5), Qt::LeftButton, Qt::NoButton, Qt::NoModifier);
+    stage.view.setExportRunning(true);
+    QCoreApplication::sendEvent(&stage.view, &release);
+    QCoreApplication::sendEvent(&stage.view, &play);
+    QTest::qWait(400);
+    QVERIFY(stage.view.animationRunning());
+    stage.view.setExportRunning(false);
+
+    // A click stops it after 300 ms, and the next tick brings the user's view back.
+    QSignalSpy restored(&stage.view, &MapView::locationSettingsChanged);
+    QCoreApplication::sendEvent(&stage.view, &release);
+    QTest::qWait(150);
+    QVERIFY(stage.view.animationRunning());
+    QTRY_VERIFY(!stage.view.animationRunning());
+    QTRY_VERIFY(!restored.isEmpty());
+    QCOMPARE(fields.currentZoomLevel, 16.0);
+    QCOMPARE(stage.view.locationSettings().value(QStringLiteral("zoomLevel")).toDouble(), 16.0);
+    QCOMPARE(stage.view.locationSettings().value(QStringLiteral("bearing")).toDouble(), 10.0);
+}

@@ -172,12 +172,6 @@ int main(int argc, char *argv[])
              s.view().setAnimationMode(1);
              s.view().startAnimation();
              QTest::qWait(6000);
-             err() << "DEBUG camera " << QVariant(s.view().animationCamera()).toString() << " "
-                   << s.view().animationCamera().value("centerLongitude").toDouble() << " pose "
-                   << s.view().avatarPose().value("longitude").toDouble() << " map "
-                   << s.find("worldMap")->property("center").value<QGeoCoordinate>().longitude()
-                   << " playing " << s.find("mapStage")->property("playing").toBool() << "\n";
-             err().flush();
              return s.view().animationRunning();
          }},
         {"waypoint-edit", [](Stage &s) { return s.editRoute(KeyPointItemsData::KeyPointPage); }},
