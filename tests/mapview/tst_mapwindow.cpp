@@ -44,6 +44,7 @@ private slots:
 
     void interfaceHandsOverItsStrings();
     void trackOpensOnTheMap();
+    void previewCameraFollowsTheAvatar();
     void clickOnTheMapAddsAWaypointThatASaveKeeps();
     void failedLoadShowsTheErrorBox();
 
@@ -141,6 +142,42 @@ void tst_MapWindow::trackOpensOnTheMap()
     QVERIFY(path.keyPoints.size() >= 2);
     QCOMPARE(onMap("routeSegment"), int(path.pathSegments.size()));
     QCOMPARE(onMap("waypointMarker"), int(path.keyPoints.size()));
+}
+
+void tst_MapWindow::previewCameraFollowsTheAvatar()
+{
+    QObject *map = m_view->rootObject()->findChild<QObject *>("worldMap");
+    QObject *avatar = m_view->rootObject()->findChild<QObject *>("avatarMarker");
+    QVERIFY(map && avatar);
+    m_view->setAnimationMode(1);
+    m_view->startAnimation();
+    QTRY_VERIFY(avatar->property("visible").toBool());
+    // Past the pause at the first waypoint
+    QTRY_COMPARE(m_view->animationEvent().value(QStringLiteral("type")).toString(), QStringLiteral("step"));
+
+    // Frame after frame the avatar has moved on, and the map's centre is on it.
+    struct Frame
+    {
+        QGeoCoordinate avatar;
+        QGeoCoordinate centre;
+    };
+    // Sampled on this thread, a little longer apart than the film's frames.
+    QList<Frame> frames;
+    while (frames.size() < 20) {
+        QTest::qWait(40);
+        frames.append({avatar->property("coordinate").value<QGeoCoordinate>(),
+                       map->property("center").value<QGeoCoordinate>()});
+    }
+    int moved = 0;
+    for (int i = 1; i < frames.size(); ++i) {
+        moved += frames[i].avatar != frames[i - 1].avatar;
+        QVERIFY2(frames[i].avatar.distanceTo(frames[i].centre) < 100.0,
+                 qPrintable(QString::number(frames[i].avatar.distanceTo(frames[i].centre))));
+    }
+    QVERIFY2(moved >= frames.size() - 3, qPrintable(QString::number(moved)));
+
+    m_view->stopAnimation(true);
+    QTRY_VERIFY(!avatar->property("visible").toBool());
 }
 
 void tst_MapWindow::failedLoadShowsTheErrorBox()
