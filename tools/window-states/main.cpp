@@ -74,9 +74,20 @@ public:
         QTest::mouseClick(&view(), Qt::LeftButton, Qt::NoModifier, centre.toPoint());
     }
 
-    // A short route through three towns, seen whole, with the second one chosen and
-    // the settings panel open on `page`.
+    // The three towns, the second one chosen and the settings panel open on `page`.
     bool editRoute(int page) const
+    {
+        if (!threeTowns())
+            return false;
+        QKeyPointItemsModel &waypoints = view().keyPointItemsModel();
+        waypoints.setActiveKeyPointId(int(document().pathManager().active()->keyPoints[1].id));
+        waypoints.setCurrentSettingsPage(page);
+        view().rootObject()->setProperty("settingsOpen", true);
+        return true;
+    }
+
+    // A short route through three towns, seen whole.
+    bool threeTowns() const
     {
         QKeyPointItemsModel &waypoints = view().keyPointItemsModel();
         waypoints.addKeyPoint(8.3093, 47.0502, 0.0, QStringLiteral("Lucerne, Switzerland"));
@@ -85,14 +96,11 @@ public:
         const Path *path = document().pathManager().active();
         if (!path || path->keyPoints.size() != 3)
             return false;
-        waypoints.setActiveKeyPointId(int(path->keyPoints[1].id));
-        waypoints.setCurrentSettingsPage(page);
         QObject *map = find("worldMap");
         if (!map)
             return false;
         map->setProperty("center", QVariant::fromValue(QGeoCoordinate(47.21, 8.50)));
         map->setProperty("zoomLevel", 10.2);
-        view().rootObject()->setProperty("settingsOpen", true);
         return true;
     }
 
@@ -165,13 +173,16 @@ int main(int argc, char *argv[])
     const QList<State> states = {
         {"window", [](Stage &) { return true; }},
         {"track", [&](Stage &s) { return s.openFile(track); }},
+        // Half-way between the second and the third town, the camera on the avatar.
         {"playback",
-         [&](Stage &s) {
-             if (!s.openFile(track))
+         [](Stage &s) {
+             if (!s.threeTowns())
                  return false;
+             s.find("worldMap")->setProperty("zoomLevel", 11.5);
+             Stage::settle();
              s.view().setAnimationMode(1);
              s.view().startAnimation();
-             QTest::qWait(6000);
+             QTest::qWait(4700);
              return s.view().animationRunning();
          }},
         {"waypoint-edit", [](Stage &s) { return s.editRoute(KeyPointItemsData::KeyPointPage); }},
