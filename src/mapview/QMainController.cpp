@@ -21,7 +21,8 @@ const QString projectExtension = QStringLiteral("zkgeo");
 
 QMainController::QMainController(PainterPathRenderer_Controller *document, const AppSettings &settings)
     : m_document(document), m_settings(settings), m_fileDialogs(std::make_unique<QtFileDialogs>()),
-      m_keyPointData(document)
+      m_keyPointData(document),
+      m_pilotData(document, m_settings, [this] { return m_keyPointData.activeKeyPointId(); })
 {
     m_actions = {{QStringLiteral("actionNone"), -1},
                  {QStringLiteral("actionNewProject"), 1000},

@@ -3,6 +3,7 @@
 #include "app/AppSettings.h"
 #include "mapview/FileDialogs.h"
 #include "models/KeyPointItemsData.h"
+#include "models/PilotItemsData.h"
 
 #include <QDateTime>
 #include <QObject>
@@ -75,6 +76,8 @@ public:
 
     // The waypoints of the active path as the interface lists and edits them.
     KeyPointItemsData &keyPointData() { return m_keyPointData; }
+    // The avatars, chosen for the segment of the active key point.
+    PilotItemsData &pilotData() { return m_pilotData; }
 
     FileDialogs &fileDialogs() { return *m_fileDialogs; }
     void setFileDialogs(std::unique_ptr<FileDialogs> dialogs) { m_fileDialogs = std::move(dialogs); }
@@ -86,6 +89,7 @@ private:
     QVariantMap m_actions;
     std::unique_ptr<FileDialogs> m_fileDialogs;
     KeyPointItemsData m_keyPointData;
+    PilotItemsData m_pilotData;
     QString m_programVersion;
     bool m_isFirstStart = false;
     bool m_markerLocked = false;

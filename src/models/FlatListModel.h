@@ -2,6 +2,8 @@
 
 #include <QAbstractItemModel>
 
+#include <initializer_list>
+
 // The frame of the interface's lists: one column of rows, no tree. Subclasses give
 // rowCount, data and roleNames.
 class FlatListModel : public QAbstractItemModel
@@ -17,4 +19,9 @@ public:
     }
     QModelIndex parent(const QModelIndex &) const override { return QModelIndex(); }
     int columnCount(const QModelIndex &parent = QModelIndex()) const override { return parent.isValid() ? 0 : 1; }
+
+protected:
+    // Connects each named signal of the interface's object `objectName` under `root` to
+    // this model's slot of the same name. Without that object nothing is connected.
+    void connectSignalsByName(QObject *root, const QString &objectName, std::initializer_list<const char *> names);
 };

@@ -1,9 +1,5 @@
 #include "models/QKeyPointItemsModel.h"
 
-#include "app/Trace.h"
-
-#include <QMetaMethod>
-
 #include <algorithm>
 
 namespace {
@@ -37,16 +33,6 @@ int roleOf(int code)
     }
 }
 
-int methodIndexByName(const QMetaObject *meta, QMetaMethod::MethodType type, const QByteArray &name)
-{
-    for (int i = meta->methodOffset(); i < meta->methodCount(); ++i) {
-        const QMetaMethod method = meta->method(i);
-        if (method.methodType() == type && method.name() == name)
-            return i;
-    }
-    return -1;
-}
-
 } // namespace
 
 QKeyPointItemsModel::QKeyPointItemsModel(QObject *parent) : FlatListModel(parent)
@@ -64,26 +50,12 @@ void QKeyPointItemsModel::setData(KeyPointItemsData *data)
 
 void QKeyPointItemsModel::connectSignalList(QObject *root)
 {
-    static const char *const names[] = {
-        "setCurrentSettingsPage", "setActiveKeyPointId", "enableAllKeyPoints", "enableKeyPoint", "setKeyPointImage",
-        "setKeyPointSize", "setKeyPointPauseDuration", "setKeyPointAnimationDuration", "setKeyPointText",
-        "openFontDialog", "setKeyPointFontColor", "setKeyPointFontFrame", "setKeyPointFontShadow",
-        "setUserPhotoAsWaypoint", "addKeyPoint", "deleteKeyPoint", "deleteMediaPoint"};
-    const QString objectName = QStringLiteral("KeyPointItemsSignalList_Obj");
-    QObject *list = root ? root->findChild<QObject *>(objectName) : nullptr;
-    if (!list)
-        return;
-    const QMetaObject *theirs = list->metaObject();
-    const QMetaObject *ours = metaObject();
-    for (const char *name : names) {
-        // The interface declares its own signals, so they lie beyond its base classes.
-        const int signal = methodIndexByName(theirs, QMetaMethod::Signal, name);
-        const int slot = methodIndexByName(ours, QMetaMethod::Slot, name);
-        if (signal < 0 || slot < 0)
-            continue;
-        if (!connect(list, theirs->method(signal), this, ours->method(slot)))
-            logTrace(3, QStringLiteral("QKeyPointItemsModel::connectSignalList: %s not connected"), name);
-    }
+    connectSignalsByName(root, QStringLiteral("KeyPointItemsSignalList_Obj"),
+                         {"setCurrentSettingsPage", "setActiveKeyPointId", "enableAllKeyPoints", "enableKeyPoint",
+                          "setKeyPointImage", "setKeyPointSize", "setKeyPointPauseDuration",
+                          "setKeyPointAnimationDuration", "setKeyPointText", "openFontDialog", "setKeyPointFontColor",
+                          "setKeyPointFontFrame", "setKeyPointFontShadow", "setUserPhotoAsWaypoint", "addKeyPoint",
+                          "deleteKeyPoint", "deleteMediaPoint"});
 }
 
 int QKeyPointItemsModel::rowCount(const QModelIndex &parent) const

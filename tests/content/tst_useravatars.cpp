@@ -1,4 +1,5 @@
 #include "ContentFiles.h"
+#include "ZipFiles.h"
 
 #include "content/ContentCatalogue.h"
 #include "content/IniAccess.h"
@@ -9,36 +10,9 @@
 #include <QTemporaryDir>
 #include <QTest>
 
-#include <zip.h>
-
-#include <utility>
 #include <vector>
 
 namespace {
-
-using Entries = std::vector<std::pair<QByteArray, QByteArray>>; // name, content; a name ending in "/" is a folder
-
-bool writeZip(const QString &path, const Entries &entries)
-{
-    int error = 0;
-    zip_t *archive = zip_open(QFile::encodeName(path).constData(), ZIP_CREATE | ZIP_TRUNCATE, &error);
-    if (!archive)
-        return false;
-    for (const auto &entry : entries) {
-        if (entry.first.endsWith('/')) {
-            if (zip_dir_add(archive, entry.first.constData(), ZIP_FL_ENC_UTF_8) < 0)
-                return false;
-            continue;
-        }
-        zip_source_t *source = zip_source_buffer(archive, entry.second.constData(), zip_uint64_t(entry.second.size()), 0);
-        if (!source || zip_file_add(archive, entry.first.constData(), source, ZIP_FL_ENC_UTF_8) < 0) {
-            zip_source_free(source);
-            zip_discard(archive);
-            return false;
-        }
-    }
-    return zip_close(archive) == 0;
-}
 
 QStringList entriesBelow(const QString &folder)
 {
@@ -151,7 +125,7 @@ private slots:
     {
         const QString data = path(QStringLiteral("hostile"));
         QVERIFY(QDir().mkpath(data));
-        const QList<Entries> hostile = {
+        const QList<ZipEntries> hostile = {
             {{"ok_1.png", "x"}, {"../escape.png", "evil"}},
             {{"ok_1.png", "x"}, {"sub/../../../escape.png", "evil"}},
             {{"/tmp/escape.png", "evil"}},
