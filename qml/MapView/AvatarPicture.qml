@@ -16,9 +16,11 @@ Item {
     // The number of steps the film has asked an animated picture for
     property int step: 0
 
-    readonly property bool perspective: pilot.displayFormat === "perspective"
-    readonly property bool animated: pilot.animated === true && !perspective
-    readonly property string source: Urls.fromPath(pilot.sourceFileName)
+    // Each picture reads the pilot itself: a binding that read another one of this
+    // item could see it from before the change and load the wrong kind of file.
+    function sourceOf(pilot, kind) {
+        return AvatarView.kindOf(pilot) === kind ? Urls.fromPath(pilot.sourceFileName) : ""
+    }
     readonly property var flat: AvatarView.flatPose(heading, pilot.pilotRotation === true,
                                                     pilot.pilotSymmetric === true)
     readonly property int seriesFrames: 72
@@ -29,8 +31,8 @@ Item {
     Image {
         objectName: "avatarStill"
         anchors.fill: parent
-        visible: !avatar.perspective && !avatar.animated
-        source: visible ? avatar.source : ""
+        source: avatar.sourceOf(avatar.pilot, "still")
+        visible: source !== ""
         sourceSize: Qt.size(avatar.width * 2, avatar.height * 2)
         fillMode: Image.PreserveAspectFit
         mirror: avatar.flat.mirrored
@@ -41,8 +43,8 @@ Item {
     AnimatedImage {
         objectName: "avatarAnimated"
         anchors.fill: parent
-        visible: avatar.animated
-        source: visible ? avatar.source : ""
+        source: avatar.sourceOf(avatar.pilot, "animated")
+        visible: source !== ""
         fillMode: Image.PreserveAspectFit
         playing: false
         currentFrame: frameCount > 0 ? avatar.step % frameCount : 0
@@ -55,9 +57,9 @@ Item {
     Image {
         objectName: "avatarSeries"
         anchors.fill: parent
-        visible: avatar.perspective
-        source: visible && avatar.source !== ""
-                ? avatar.source + "_" + AvatarView.frameNumber(avatar.heading, avatar.seriesFrames) + ".png" : ""
+        readonly property string stem: avatar.sourceOf(avatar.pilot, "series")
+        source: stem !== "" ? stem + "_" + AvatarView.frameNumber(avatar.heading, avatar.seriesFrames) + ".png" : ""
+        visible: source !== ""
         fillMode: Image.PreserveAspectFit
         smooth: true
     }

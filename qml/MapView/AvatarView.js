@@ -8,6 +8,16 @@ function normalized(degrees) {
     return a < 0 ? a + 360 : a
 }
 
+// "series" for a 3D avatar, "animated" for an animated picture, "still" for any
+// other picture, "" without one.
+function kindOf(pilot) {
+    if (!pilot || !pilot.sourceFileName)
+        return ""
+    if (pilot.displayFormat === "perspective")
+        return "series"
+    return pilot.animated === true ? "animated" : "still"
+}
+
 // {rotation, mirrored} for a flat picture. Pictures seen from above show their nose
 // up and turn with the road; pictures seen from the side face right and are
 // mirrored when heading left, so that they never stand on their heads.

@@ -10,6 +10,7 @@
 #include "app/Translators.h"
 #include "app/gui/StartupSplash.h"
 #include "mapview/QtKeyPointDialogs.h"
+#include "mapview/QtPilotDialogs.h"
 #include "gpx/GpxWriter.h"
 #include "path/PathMode.h"
 #include "project/DocumentAnimationSource.h"
@@ -117,6 +118,7 @@ void MapView::init(QWidget *window, bool hide, const QUrl &source)
         connectSignalList(signalList);
     initLists();
     initKeyPointModels(root);
+    initPilotModel(root);
     showSplashMessage(SplashMessage::InitTracking);
     showSplashMessage(SplashMessage::ConnectQml);
 
@@ -146,6 +148,11 @@ void MapView::initLists()
     m_keyPointImageItemsModel.setData(&m_mainController.keyPointData().imageItems());
     m_keyPointImageItemsModel.refill(catalogue.waypoints(), browseTitle());
     rebuildAnimationFrames();
+
+    PilotItemsData &pilots = m_mainController.pilotData();
+    pilots.setDialogs(std::make_unique<QtPilotDialogs>(m_mainController, m_window));
+    m_pilotItemsModel.setData(&pilots);
+    m_pilotItemsModel.fill(catalogue, browseTitle());
 }
 
 QString MapView::browseTitle() const
@@ -165,6 +172,16 @@ void MapView::initKeyPointModels(QObject *root)
     connect(&m_keyPointItemsModel, &QKeyPointItemsModel::triggerLoadState, this, &MapView::triggerLoadState);
     connect(this, &MapView::setActiveKeyPointId, &m_keyPointItemsModel, &QKeyPointItemsModel::setActiveKeyPointId);
     rootContext()->setContextProperty(QStringLiteral("keyPointImageItemsModel"), &m_keyPointImageItemsModel);
+}
+
+void MapView::initPilotModel(QObject *root)
+{
+    m_pilotItemsModel.connectSignalList(root);
+    rootContext()->setContextProperty(QStringLiteral("pilotItemsModel"), &m_pilotItemsModel);
+    connect(&m_keyPointItemsModel, &QKeyPointItemsModel::activeKeyPointIdChanged, &m_pilotItemsModel,
+            &QPilotItemsModel::activeKeyPointIdChanged);
+    connect(&m_pilotItemsModel, &QPilotItemsModel::projectIsModified, this, &MapView::projectIsModified);
+    connect(&m_pilotItemsModel, &QPilotItemsModel::showError, this, &MapView::DoShowError);
 }
 
 void MapView::connectSignalList(QObject *signalList)
@@ -328,7 +345,7 @@ void MapView::triggerMessageBoxAction(int messageId)
         // interface reads for "actionSaveAndLoadGPX" reaches nothing.
         {"actionSaveAndLoadGPXProject", &MapView::saveThenLoadTrack},
         {"actionShowTutorial", &MapView::showTutorial},
-        {"actionDeleteUserAvatar", nullptr},
+        {"actionDeleteUserAvatar", &MapView::deleteUserAvatar},
         // Opens a system settings page that this platform does not have.
         {"actionOpenWindowsSettings", nullptr},
     };
@@ -339,6 +356,11 @@ void MapView::triggerMessageBoxAction(int messageId)
             (this->*row.run)();
         return;
     }
+}
+
+void MapView::deleteUserAvatar()
+{
+    m_pilotItemsModel.deleteUserPilot();
 }
 
 void MapView::saveThenClose()
@@ -412,6 +434,7 @@ void MapView::resetViews()
     updateSceneSize();
     emit keyPointsFixedChanged();
     m_markerMoveSID1 = 0;
+    m_pilotItemsModel.activeKeyPointIdChanged();
     setWindowTitle(applicationTitle());
 }
 
@@ -474,6 +497,8 @@ void MapView::delayedLoadProjectFinish()
     const int32_t pathType = path ? path->pathType : PathType::Ordinary;
 
     m_keyPointItemsModel.loadKeyPoints();
+    // The avatar page shows the avatar of the loaded project.
+    m_pilotItemsModel.activeKeyPointIdChanged();
 
     setProjectModified(false);
     emit mapFrameSourceChanged();

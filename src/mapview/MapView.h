@@ -8,6 +8,7 @@
 #include "project/DocumentAnimationSource.h"
 #include "models/QKeyPointImageItemsModel.h"
 #include "models/QKeyPointItemsModel.h"
+#include "models/QPilotItemsModel.h"
 
 #include <QGeoCoordinate>
 #include <QQuickView>
@@ -152,6 +153,7 @@ public:
     QMainController &mainController() { return m_mainController; }
     QKeyPointItemsModel &keyPointItemsModel() { return m_keyPointItemsModel; }
     QKeyPointImageItemsModel &keyPointImageItemsModel() { return m_keyPointImageItemsModel; }
+    QPilotItemsModel &pilotItemsModel() { return m_pilotItemsModel; }
 
     // The zoom level at which an extent of `current` degrees fills a view that showed
     // `target` degrees at `zoom`. The result lies in the map's range of zoom levels.
@@ -424,6 +426,7 @@ private:
     // The content catalogue and the lists made from it, then the waypoint models.
     void initLists();
     void initKeyPointModels(QObject *root);
+    void initPilotModel(QObject *root);
     QString browseTitle() const;
     // The lock rule for the hovered key point and the signals that follow a change.
     void applyMarkerLock(uint32_t keyPointId);
@@ -448,6 +451,7 @@ private:
     void saveThenLoadProject();
     void saveThenLoadTrack();
     void sendVideo();
+    void deleteUserAvatar();
     void showTutorial();
     void rebuildLocationSettings();
     void rebuildDebugPages();
@@ -495,6 +499,7 @@ private:
 
     QKeyPointItemsModel m_keyPointItemsModel;
     QKeyPointImageItemsModel m_keyPointImageItemsModel;
+    QPilotItemsModel m_pilotItemsModel;
 
     DocumentAnimationSource m_animationSource;
     AnimationEventList m_eventList;

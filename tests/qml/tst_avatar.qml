@@ -36,6 +36,20 @@ Item {
             compare(pose.mirrored, data.mirrored)
         }
 
+        function test_kindOf_data() {
+            return [
+                { tag: "3D series", pilot: { sourceFileName: "/a/ZK3D/car/car", displayFormat: "perspective" }, kind: "series" },
+                { tag: "animated picture", pilot: { sourceFileName: "/a/b.gif", displayFormat: "2D", animated: true }, kind: "animated" },
+                { tag: "picture", pilot: { sourceFileName: "/a/b.png", displayFormat: "2D", animated: false }, kind: "still" },
+                { tag: "no picture", pilot: { sourceFileName: "", displayFormat: "perspective" }, kind: "" },
+                { tag: "nothing chosen", pilot: ({}), kind: "" },
+            ]
+        }
+
+        function test_kindOf(data) {
+            compare(AvatarView.kindOf(data.pilot), data.kind)
+        }
+
         function test_frameNumber_data() {
             return [
                 { tag: "north", heading: 0, frame: 1 },
