@@ -18,6 +18,7 @@ Item {
     property var avatars: typeof pilotItemsModel !== "undefined" ? pilotItemsModel : null
     readonly property int activeWaypointId: waypoints ? waypoints.activeKeyPointId : 0
     property bool settingsOpen: false
+    property bool filmSettingsOpen: false
 
     readonly property var actions: host.messageBoxAction
     readonly property bool modalOpen: messageBox.visible || hintBox.visible
@@ -181,6 +182,26 @@ Item {
         onPathSettingsEdited: host.pathSettings = settings
         onPathModeChosen: signalList.setPathMode(mode)
         onCloseRequested: root.settingsOpen = false
+    }
+
+    TimelineBar {
+        id: timeline
+        objectName: "timelineBar"
+        anchors.horizontalCenter: parent.horizontalCenter
+        anchors.bottom: parent.bottom
+        anchors.margins: Theme.spaceL
+        width: Math.min(Theme.timelineWidth, root.width - 2 * Theme.spaceL)
+        enabled: !root.modalOpen
+        playing: root.playing
+        position: host.currentPosition
+        positionText: host.timeLinePositionAsString
+        lengthText: host.animationDurationAsString
+        settingsOpen: root.filmSettingsOpen
+        onPlayRequested: signalList.startAnimation()
+        onStopRequested: signalList.stopAnimation(true)
+        onSeekRequested: signalList.setTimelinePosition(position)
+        onSettingsToggled: root.filmSettingsOpen = !root.filmSettingsOpen
+        onFullScreenRequested: host.toggleFullScreen()
     }
 
     // Deletes the waypoint being edited; a text field that has the keys keeps them.

@@ -49,6 +49,7 @@ QtObject {
     readonly property int dialogWidth: 440
     readonly property int panelWidth: 328
     readonly property int searchWidth: 280
+    readonly property int timelineWidth: 760
     readonly property int swatchSize: 28
     readonly property int symbolTileSize: 52
 

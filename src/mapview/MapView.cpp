@@ -766,6 +766,7 @@ void MapView::pathChanged()
     emit mouseOverPathChanged();
     rebuildDebugPages();
     emit debugInfoPagesChanged();
+    m_eventList.updateDuration();
     emit animationDurationChanged();
     emit animationDurationAsStringChanged();
     emit timeLinePositionAsStringChanged();

@@ -417,6 +417,7 @@ protected:
 
 private:
     bool visibleRegion(GeoRect &region) const override;
+    bool releaseIsOnTheMap() const;
     void seekToEnd();
     // The event that playback has reached: pose, camera and timeline follow it.
     void showPlaybackEvent();

@@ -300,9 +300,19 @@ void MapView::playbackEndShown()
     emit centerPositionChanged();
 }
 
+// A click on the map, not on one of the controls over it such as the timeline.
+bool MapView::releaseIsOnTheMap() const
+{
+    for (const QQuickItem *item = mouseGrabberItem(); item; item = item->parentItem()) {
+        if (item->objectName() == QLatin1String("mapStage"))
+            return true;
+    }
+    return mouseGrabberItem() == nullptr;
+}
+
 void MapView::mouseReleaseEvent(QMouseEvent *event)
 {
-    if (m_animationRunning)
+    if (m_animationRunning && releaseIsOnTheMap())
         QTimer::singleShot(stopAfterClick, this, &MapView::killAnimation);
     QQuickView::mouseReleaseEvent(event);
 }

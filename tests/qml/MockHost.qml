@@ -33,6 +33,20 @@ QtObject {
     property int keypointHoveredID: 0
     signal keyPointPositionChanged(int kpId, double longitude, double latitude)
 
+    // The film
+    property bool animationRunning: false
+    property real currentPosition: 0
+    property string timeLinePositionAsString: "00m00s"
+    property string animationDurationAsString: "00m10s"
+    property var animationEvent: ({})
+    property var animationCamera: ({})
+    property var avatarPose: ({})
+    property int currentAnimationMode: 0
+    property var animationFrames: []
+    property int currentAnimationFrame: 0
+    property bool animateKeyPoints: true
+    property int keyPointAnimationDuration: 2
+
     property var strHostStrings: ({})
     property int stringWrites: 0
     onStrHostStringsChanged: ++stringWrites
