@@ -77,7 +77,9 @@ Item {
         id: keyPointRequests
     }
     KeyPointImageItemsSignalList {}
-    PilotItemsSignalList {}
+    PilotItemsSignalList {
+        id: pilotRequests
+    }
     TrackingList {}
     BackgroundChooserSignalList {}
     ExportSignalList {}
@@ -182,6 +184,14 @@ Item {
         onPathSettingsEdited: host.pathSettings = settings
         onPathModeChosen: signalList.setPathMode(mode)
         onCloseRequested: root.settingsOpen = false
+        avatars: root.avatars
+        avatarRequests: pilotRequests
+        // The model lets the pictures go before their files are deleted.
+        onDeleteAvatarRequested: {
+            pilotRequests.setDeletePilotID(pilotId)
+            messageBox.ask(qsTr("Delete this avatar?"),
+                           root.action("actionDeleteUserAvatar"), root.action("actionNone"), root.action("actionNone"))
+        }
     }
 
     TimelineBar {

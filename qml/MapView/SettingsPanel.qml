@@ -10,6 +10,9 @@ Control {
 
     property var waypoints: null
     property var symbols: null
+    // The avatar list and "PilotItemsSignalList_Obj"
+    property var avatars: null
+    property var avatarRequests: null
     // KeyPointItemsSignalList_Obj
     property var requests: null
     property alias pathSettings: routePage.pathSettings
@@ -21,11 +24,12 @@ Control {
     signal pathSettingsEdited(var settings)
     signal pathModeChosen(int mode)
     signal closeRequested()
+    signal deleteAvatarRequested(int pilotId)
 
-    // Page names to ids, the model's availableSettingsPages; of these the panel
-    // shows "path" and "keyPoint".
+    // Page names to ids, the model's availableSettingsPages: "path", "keyPoint" and
+    // "avatar", which are also the tabs' indices.
     readonly property var pageIds: waypoints && waypoints.availableSettingsPages ? waypoints.availableSettingsPages
-                                                                                 : ({ "path": 0, "keyPoint": 1 })
+                                                                                 : ({ "path": 0, "keyPoint": 1, "avatar": 2 })
     // Until the model is there the panel keeps its page itself.
     property int localPage: pageIds["keyPoint"]
     readonly property int currentPage: waypoints ? waypoints.currentSettingsPage : localPage
@@ -38,7 +42,7 @@ Control {
         if (requests && waypoints)
             requests.setCurrentSettingsPage(id)
         // A tab shows the page the model has, whatever was clicked.
-        tabs.currentIndex = Qt.binding(function () { return panel.currentPage === panel.pageIds["path"] ? 0 : 1 })
+        tabs.currentIndex = Qt.binding(function () { return panel.currentPage })
     }
 
     implicitWidth: Theme.panelWidth
@@ -64,12 +68,14 @@ Control {
                 id: tabs
                 Layout.fillWidth: true
                 background: null
-                currentIndex: panel.currentPage === panel.pageIds["path"] ? 0 : 1
+                currentIndex: panel.currentPage
                 TabButton {
                     objectName: "routePageTab"
                     text: qsTr("Route")
                     font.capitalization: Font.MixedCase
                     font.pixelSize: Theme.textBody
+                    leftPadding: Theme.spaceS
+                    rightPadding: Theme.spaceS
                     onClicked: panel.showPage("path")
                 }
                 TabButton {
@@ -77,7 +83,18 @@ Control {
                     text: qsTr("Waypoint")
                     font.capitalization: Font.MixedCase
                     font.pixelSize: Theme.textBody
+                    leftPadding: Theme.spaceS
+                    rightPadding: Theme.spaceS
                     onClicked: panel.showPage("keyPoint")
+                }
+                TabButton {
+                    objectName: "avatarPageTab"
+                    text: qsTr("Avatar")
+                    font.capitalization: Font.MixedCase
+                    font.pixelSize: Theme.textBody
+                    leftPadding: Theme.spaceS
+                    rightPadding: Theme.spaceS
+                    onClicked: panel.showPage("avatar")
                 }
             }
             ToolBarButton {
@@ -90,7 +107,7 @@ Control {
 
         Flickable {
             id: scroll
-            readonly property Item page: tabs.currentIndex === 0 ? routePage : waypointPage
+            readonly property Item page: [routePage, waypointPage, avatarPage][tabs.currentIndex] || waypointPage
             Layout.fillWidth: true
             Layout.preferredHeight: Math.min(contentHeight, panel.maximumHeight - header.height
                                              - panel.topPadding - panel.bottomPadding - Theme.spaceS)
@@ -116,6 +133,15 @@ Control {
                 waypoints: panel.waypoints
                 symbols: panel.symbols
                 requests: panel.requests
+            }
+            AvatarSettingsPage {
+                id: avatarPage
+                objectName: "avatarSettingsPage"
+                width: scroll.width
+                visible: scroll.page === avatarPage
+                avatars: panel.avatars
+                requests: panel.avatarRequests
+                onDeleteAvatarRequested: panel.deleteAvatarRequested(pilotId)
             }
         }
     }

@@ -185,6 +185,7 @@ int main(int argc, char *argv[])
              QTest::qWait(4700);
              return s.view().animationRunning();
          }},
+        {"avatar-page", [](Stage &s) { return s.editRoute(KeyPointItemsData::AvatarPage); }},
         {"waypoint-edit", [](Stage &s) { return s.editRoute(KeyPointItemsData::KeyPointPage); }},
         {"route-settings",
          [](Stage &s) {
