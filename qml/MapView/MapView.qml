@@ -19,6 +19,9 @@ Item {
     readonly property int activeWaypointId: waypoints ? waypoints.activeKeyPointId : 0
     property bool settingsOpen: false
     property bool filmSettingsOpen: false
+    // The two panels share the right side: one at a time.
+    onSettingsOpenChanged: if (settingsOpen) filmSettingsOpen = false
+    onFilmSettingsOpenChanged: if (filmSettingsOpen) settingsOpen = false
 
     readonly property var actions: host.messageBoxAction
     readonly property bool modalOpen: messageBox.visible || hintBox.visible
@@ -192,6 +195,20 @@ Item {
             messageBox.ask(qsTr("Delete this avatar?"),
                            root.action("actionDeleteUserAvatar"), root.action("actionNone"), root.action("actionNone"))
         }
+    }
+
+    FilmSettingsPanel {
+        objectName: "filmSettingsPanel"
+        anchors.right: parent.right
+        anchors.bottom: timeline.top
+        anchors.margins: Theme.spaceL
+        anchors.bottomMargin: Theme.spaceS
+        maximumHeight: timeline.y - toolBar.y - toolBar.height - 2 * Theme.spaceL
+        visible: root.filmSettingsOpen
+        enabled: !root.modalOpen
+        film: host
+        requests: signalList
+        onCloseRequested: root.filmSettingsOpen = false
     }
 
     TimelineBar {

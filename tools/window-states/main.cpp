@@ -185,6 +185,15 @@ int main(int argc, char *argv[])
              QTest::qWait(4700);
              return s.view().animationRunning();
          }},
+        {"film-settings",
+         [](Stage &s) {
+             if (!s.threeTowns())
+                 return false;
+             s.view().setAnimationMode(2);
+             s.view().slotFlyInAnimation(true);
+             s.click("filmSettingsButton");
+             return true;
+         }},
         {"avatar-page", [](Stage &s) { return s.editRoute(KeyPointItemsData::AvatarPage); }},
         {"waypoint-edit", [](Stage &s) { return s.editRoute(KeyPointItemsData::KeyPointPage); }},
         {"route-settings",
