@@ -2,6 +2,28 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="de_DE">
 <context>
+    <name>AvatarGrid</name>
+    <message>
+        <source>Delete this avatar</source>
+        <translation>Diesen Avatar löschen</translation>
+    </message>
+</context>
+<context>
+    <name>AvatarSettingsPage</name>
+    <message>
+        <source>Size</source>
+        <translation>Größe</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Turn with the road</source>
+        <translation>Mit der Straße drehen</translation>
+    </message>
+</context>
+<context>
     <name>DurationField</name>
     <message>
         <source>s</source>
@@ -18,6 +40,112 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPage</name>
+    <message>
+        <source>Length, of the longest film</source>
+        <translation>Länge, vom längsten Film</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Longest film</source>
+        <translation>Längster Film</translation>
+    </message>
+    <message>
+        <source>Even pace over the whole route</source>
+        <translation>Gleichmäßiges Tempo auf der ganzen Route</translation>
+    </message>
+    <message>
+        <source>Waypoints</source>
+        <translation>Wegpunkte</translation>
+    </message>
+    <message>
+        <source>Appear when reached</source>
+        <translation>Beim Erreichen einblenden</translation>
+    </message>
+    <message>
+        <source>Pop up</source>
+        <translation>Aufspringen lassen</translation>
+    </message>
+    <message>
+        <source>Pop-up time</source>
+        <translation>Dauer des Aufspringens</translation>
+    </message>
+    <message>
+        <source>%1 s</source>
+        <translation>%1 s</translation>
+    </message>
+    <message>
+        <source>No stops at waypoints</source>
+        <translation>Nicht an Wegpunkten halten</translation>
+    </message>
+    <message>
+        <source>Camera</source>
+        <translation>Kamera</translation>
+    </message>
+    <message>
+        <source>Still</source>
+        <extracomment>The camera stays where the user left the map</extracomment>
+        <translation>Fest</translation>
+    </message>
+    <message>
+        <source>Follow</source>
+        <extracomment>The camera keeps the avatar in the middle</extracomment>
+        <translation>Folgen</translation>
+    </message>
+    <message>
+        <source>Circle</source>
+        <extracomment>The camera follows, the map seen through a round frame</extracomment>
+        <translation>Kreis</translation>
+    </message>
+    <message>
+        <source>Frame</source>
+        <extracomment>The camera follows, the map seen through a frame of a chosen shape</extracomment>
+        <translation>Rahmen</translation>
+    </message>
+    <message>
+        <source>Fly in at the start</source>
+        <translation>Zu Beginn einfliegen</translation>
+    </message>
+    <message>
+        <source>Fly-in</source>
+        <translation>Anflug</translation>
+    </message>
+    <message>
+        <source>Turn on the way</source>
+        <translation>Unterwegs drehen</translation>
+    </message>
+    <message>
+        <source>Turn by</source>
+        <translation>Drehen um</translation>
+    </message>
+    <message>
+        <source>%1°</source>
+        <translation>%1°</translation>
+    </message>
+    <message>
+        <source>Tilt on the way</source>
+        <translation>Unterwegs neigen</translation>
+    </message>
+    <message>
+        <source>Tilt to</source>
+        <translation>Neigen auf</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPanel</name>
+    <message>
+        <source>Film</source>
+        <translation>Film</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Schließen</translation>
     </message>
 </context>
 <context>
@@ -277,6 +405,10 @@
         <source>This project has changes that are not saved yet. Save them first?</source>
         <translation>Dieses Projekt enthält Änderungen, die noch nicht gespeichert sind. Zuerst speichern?</translation>
     </message>
+    <message>
+        <source>Delete this avatar?</source>
+        <translation>Diesen Avatar löschen?</translation>
+    </message>
 </context>
 <context>
     <name>MessageBox</name>
@@ -349,7 +481,7 @@
     <message>
         <source>%1 %</source>
         <extracomment>Share of the film exported so far</extracomment>
-        <translation>%1 %</translation>
+        <translation>%1&#xa0;%</translation>
     </message>
     <message>
         <source>Hide window</source>
@@ -476,6 +608,33 @@
     <message>
         <source>Close</source>
         <translation>Schließen</translation>
+    </message>
+    <message>
+        <source>Avatar</source>
+        <translation>Avatar</translation>
+    </message>
+</context>
+<context>
+    <name>TimelineBar</name>
+    <message>
+        <source>Stop the preview</source>
+        <translation>Vorschau anhalten</translation>
+    </message>
+    <message>
+        <source>Play the preview</source>
+        <translation>Vorschau abspielen</translation>
+    </message>
+    <message>
+        <source>Position in the film</source>
+        <translation>Position im Film</translation>
+    </message>
+    <message>
+        <source>Settings of the film</source>
+        <translation>Einstellungen des Films</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Vollbild</translation>
     </message>
 </context>
 <context>

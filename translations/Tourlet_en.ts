@@ -2,6 +2,28 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="en_US">
 <context>
+    <name>AvatarGrid</name>
+    <message>
+        <source>Delete this avatar</source>
+        <translation>Delete this avatar</translation>
+    </message>
+</context>
+<context>
+    <name>AvatarSettingsPage</name>
+    <message>
+        <source>Size</source>
+        <translation>Size</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Turn with the road</source>
+        <translation>Turn with the road</translation>
+    </message>
+</context>
+<context>
     <name>DurationField</name>
     <message>
         <source>s</source>
@@ -18,6 +40,112 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPage</name>
+    <message>
+        <source>Length, of the longest film</source>
+        <translation>Length, of the longest film</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Longest film</source>
+        <translation>Longest film</translation>
+    </message>
+    <message>
+        <source>Even pace over the whole route</source>
+        <translation>Even pace over the whole route</translation>
+    </message>
+    <message>
+        <source>Waypoints</source>
+        <translation>Waypoints</translation>
+    </message>
+    <message>
+        <source>Appear when reached</source>
+        <translation>Appear when reached</translation>
+    </message>
+    <message>
+        <source>Pop up</source>
+        <translation>Pop up</translation>
+    </message>
+    <message>
+        <source>Pop-up time</source>
+        <translation>Pop-up time</translation>
+    </message>
+    <message>
+        <source>%1 s</source>
+        <translation>%1 s</translation>
+    </message>
+    <message>
+        <source>No stops at waypoints</source>
+        <translation>No stops at waypoints</translation>
+    </message>
+    <message>
+        <source>Camera</source>
+        <translation>Camera</translation>
+    </message>
+    <message>
+        <source>Still</source>
+        <extracomment>The camera stays where the user left the map</extracomment>
+        <translation>Still</translation>
+    </message>
+    <message>
+        <source>Follow</source>
+        <extracomment>The camera keeps the avatar in the middle</extracomment>
+        <translation>Follow</translation>
+    </message>
+    <message>
+        <source>Circle</source>
+        <extracomment>The camera follows, the map seen through a round frame</extracomment>
+        <translation>Circle</translation>
+    </message>
+    <message>
+        <source>Frame</source>
+        <extracomment>The camera follows, the map seen through a frame of a chosen shape</extracomment>
+        <translation>Frame</translation>
+    </message>
+    <message>
+        <source>Fly in at the start</source>
+        <translation>Fly in at the start</translation>
+    </message>
+    <message>
+        <source>Fly-in</source>
+        <translation>Fly-in</translation>
+    </message>
+    <message>
+        <source>Turn on the way</source>
+        <translation>Turn on the way</translation>
+    </message>
+    <message>
+        <source>Turn by</source>
+        <translation>Turn by</translation>
+    </message>
+    <message>
+        <source>%1°</source>
+        <translation>%1°</translation>
+    </message>
+    <message>
+        <source>Tilt on the way</source>
+        <translation>Tilt on the way</translation>
+    </message>
+    <message>
+        <source>Tilt to</source>
+        <translation>Tilt to</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPanel</name>
+    <message>
+        <source>Film</source>
+        <translation>Film</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Close</translation>
     </message>
 </context>
 <context>
@@ -277,6 +405,10 @@
         <source>This project has changes that are not saved yet. Save them first?</source>
         <translation>This project has changes that are not saved yet. Save them first?</translation>
     </message>
+    <message>
+        <source>Delete this avatar?</source>
+        <translation>Delete this avatar?</translation>
+    </message>
 </context>
 <context>
     <name>MessageBox</name>
@@ -476,6 +608,33 @@
     <message>
         <source>Close</source>
         <translation>Close</translation>
+    </message>
+    <message>
+        <source>Avatar</source>
+        <translation>Avatar</translation>
+    </message>
+</context>
+<context>
+    <name>TimelineBar</name>
+    <message>
+        <source>Stop the preview</source>
+        <translation>Stop the preview</translation>
+    </message>
+    <message>
+        <source>Play the preview</source>
+        <translation>Play the preview</translation>
+    </message>
+    <message>
+        <source>Position in the film</source>
+        <translation>Position in the film</translation>
+    </message>
+    <message>
+        <source>Settings of the film</source>
+        <translation>Settings of the film</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Full screen</translation>
     </message>
 </context>
 <context>

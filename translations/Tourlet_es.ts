@@ -2,6 +2,28 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="es_ES">
 <context>
+    <name>AvatarGrid</name>
+    <message>
+        <source>Delete this avatar</source>
+        <translation>Eliminar este avatar</translation>
+    </message>
+</context>
+<context>
+    <name>AvatarSettingsPage</name>
+    <message>
+        <source>Size</source>
+        <translation>Tamaño</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Turn with the road</source>
+        <translation>Girar con la carretera</translation>
+    </message>
+</context>
+<context>
     <name>DurationField</name>
     <message>
         <source>s</source>
@@ -18,6 +40,112 @@
     <message>
         <source>OK</source>
         <translation>Aceptar</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPage</name>
+    <message>
+        <source>Length, of the longest film</source>
+        <translation>Duración, de la película más larga</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Longest film</source>
+        <translation>Película más larga</translation>
+    </message>
+    <message>
+        <source>Even pace over the whole route</source>
+        <translation>Ritmo uniforme en toda la ruta</translation>
+    </message>
+    <message>
+        <source>Waypoints</source>
+        <translation>Etapas</translation>
+    </message>
+    <message>
+        <source>Appear when reached</source>
+        <translation>Aparecen al llegar</translation>
+    </message>
+    <message>
+        <source>Pop up</source>
+        <translation>Aparición animada</translation>
+    </message>
+    <message>
+        <source>Pop-up time</source>
+        <translation>Duración de la aparición</translation>
+    </message>
+    <message>
+        <source>%1 s</source>
+        <translation>%1 s</translation>
+    </message>
+    <message>
+        <source>No stops at waypoints</source>
+        <translation>Sin paradas en las etapas</translation>
+    </message>
+    <message>
+        <source>Camera</source>
+        <translation>Cámara</translation>
+    </message>
+    <message>
+        <source>Still</source>
+        <extracomment>The camera stays where the user left the map</extracomment>
+        <translation>Fija</translation>
+    </message>
+    <message>
+        <source>Follow</source>
+        <extracomment>The camera keeps the avatar in the middle</extracomment>
+        <translation>Seguir</translation>
+    </message>
+    <message>
+        <source>Circle</source>
+        <extracomment>The camera follows, the map seen through a round frame</extracomment>
+        <translation>Círculo</translation>
+    </message>
+    <message>
+        <source>Frame</source>
+        <extracomment>The camera follows, the map seen through a frame of a chosen shape</extracomment>
+        <translation>Marco</translation>
+    </message>
+    <message>
+        <source>Fly in at the start</source>
+        <translation>Llegada en vuelo al inicio</translation>
+    </message>
+    <message>
+        <source>Fly-in</source>
+        <translation>Llegada en vuelo</translation>
+    </message>
+    <message>
+        <source>Turn on the way</source>
+        <translation>Girar por el camino</translation>
+    </message>
+    <message>
+        <source>Turn by</source>
+        <translation>Girar</translation>
+    </message>
+    <message>
+        <source>%1°</source>
+        <translation>%1°</translation>
+    </message>
+    <message>
+        <source>Tilt on the way</source>
+        <translation>Inclinar por el camino</translation>
+    </message>
+    <message>
+        <source>Tilt to</source>
+        <translation>Inclinar hasta</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPanel</name>
+    <message>
+        <source>Film</source>
+        <translation>Película</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Cerrar</translation>
     </message>
 </context>
 <context>
@@ -277,6 +405,10 @@
         <source>This project has changes that are not saved yet. Save them first?</source>
         <translation>Este proyecto tiene cambios que aún no se han guardado. ¿Guardarlos primero?</translation>
     </message>
+    <message>
+        <source>Delete this avatar?</source>
+        <translation>¿Eliminar este avatar?</translation>
+    </message>
 </context>
 <context>
     <name>MessageBox</name>
@@ -349,7 +481,7 @@
     <message>
         <source>%1 %</source>
         <extracomment>Share of the film exported so far</extracomment>
-        <translation>%1 %</translation>
+        <translation>%1&#xa0;%</translation>
     </message>
     <message>
         <source>Hide window</source>
@@ -476,6 +608,33 @@
     <message>
         <source>Close</source>
         <translation>Cerrar</translation>
+    </message>
+    <message>
+        <source>Avatar</source>
+        <translation>Avatar</translation>
+    </message>
+</context>
+<context>
+    <name>TimelineBar</name>
+    <message>
+        <source>Stop the preview</source>
+        <translation>Detener la vista previa</translation>
+    </message>
+    <message>
+        <source>Play the preview</source>
+        <translation>Reproducir la vista previa</translation>
+    </message>
+    <message>
+        <source>Position in the film</source>
+        <translation>Posición en la película</translation>
+    </message>
+    <message>
+        <source>Settings of the film</source>
+        <translation>Ajustes de la película</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Pantalla completa</translation>
     </message>
 </context>
 <context>

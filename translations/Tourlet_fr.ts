@@ -2,6 +2,28 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="fr_FR">
 <context>
+    <name>AvatarGrid</name>
+    <message>
+        <source>Delete this avatar</source>
+        <translation>Supprimer cet avatar</translation>
+    </message>
+</context>
+<context>
+    <name>AvatarSettingsPage</name>
+    <message>
+        <source>Size</source>
+        <translation>Taille</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Turn with the road</source>
+        <translation>Tourner avec la route</translation>
+    </message>
+</context>
+<context>
     <name>DurationField</name>
     <message>
         <source>s</source>
@@ -18,6 +40,112 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPage</name>
+    <message>
+        <source>Length, of the longest film</source>
+        <translation>Durée, du film le plus long</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Longest film</source>
+        <translation>Film le plus long</translation>
+    </message>
+    <message>
+        <source>Even pace over the whole route</source>
+        <translation>Allure régulière sur tout le parcours</translation>
+    </message>
+    <message>
+        <source>Waypoints</source>
+        <translation>Étapes</translation>
+    </message>
+    <message>
+        <source>Appear when reached</source>
+        <translation>Apparaissent une fois atteintes</translation>
+    </message>
+    <message>
+        <source>Pop up</source>
+        <translation>Apparition animée</translation>
+    </message>
+    <message>
+        <source>Pop-up time</source>
+        <translation>Durée de l&apos;apparition</translation>
+    </message>
+    <message>
+        <source>%1 s</source>
+        <translation>%1 s</translation>
+    </message>
+    <message>
+        <source>No stops at waypoints</source>
+        <translation>Pas d’arrêt aux étapes</translation>
+    </message>
+    <message>
+        <source>Camera</source>
+        <translation>Caméra</translation>
+    </message>
+    <message>
+        <source>Still</source>
+        <extracomment>The camera stays where the user left the map</extracomment>
+        <translation>Fixe</translation>
+    </message>
+    <message>
+        <source>Follow</source>
+        <extracomment>The camera keeps the avatar in the middle</extracomment>
+        <translation>Suivre</translation>
+    </message>
+    <message>
+        <source>Circle</source>
+        <extracomment>The camera follows, the map seen through a round frame</extracomment>
+        <translation>Cercle</translation>
+    </message>
+    <message>
+        <source>Frame</source>
+        <extracomment>The camera follows, the map seen through a frame of a chosen shape</extracomment>
+        <translation>Cadre</translation>
+    </message>
+    <message>
+        <source>Fly in at the start</source>
+        <translation>Arrivée en vol au début</translation>
+    </message>
+    <message>
+        <source>Fly-in</source>
+        <translation>Arrivée en vol</translation>
+    </message>
+    <message>
+        <source>Turn on the way</source>
+        <translation>Tourner en chemin</translation>
+    </message>
+    <message>
+        <source>Turn by</source>
+        <translation>Tourner de</translation>
+    </message>
+    <message>
+        <source>%1°</source>
+        <translation>%1°</translation>
+    </message>
+    <message>
+        <source>Tilt on the way</source>
+        <translation>Incliner en chemin</translation>
+    </message>
+    <message>
+        <source>Tilt to</source>
+        <translation>Incliner à</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPanel</name>
+    <message>
+        <source>Film</source>
+        <translation>Film</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Fermer</translation>
     </message>
 </context>
 <context>
@@ -202,23 +330,23 @@
     </message>
     <message>
         <source>10 minutes</source>
-        <translation>10 minutes</translation>
+        <translation>10&#xa0;minutes</translation>
     </message>
     <message>
         <source>1 minute</source>
-        <translation>1 minute</translation>
+        <translation>1&#xa0;minute</translation>
     </message>
     <message>
         <source>30 minutes</source>
-        <translation>30 minutes</translation>
+        <translation>30&#xa0;minutes</translation>
     </message>
     <message>
         <source>5 minutes</source>
-        <translation>5 minutes</translation>
+        <translation>5&#xa0;minutes</translation>
     </message>
     <message>
         <source>60 minutes</source>
-        <translation>60 minutes</translation>
+        <translation>60&#xa0;minutes</translation>
     </message>
     <message>
         <source>Date taken</source>
@@ -236,7 +364,7 @@
     </message>
     <message>
         <source>This project has changes that are not saved yet. Save them before Tourlet closes?</source>
-        <translation>Ce projet contient des modifications non enregistrées. Les enregistrer avant de fermer Tourlet ?</translation>
+        <translation>Ce projet contient des modifications non enregistrées. Les enregistrer avant de fermer Tourlet&#xa0;?</translation>
     </message>
     <message>
         <source>Save altitude theme</source>
@@ -275,7 +403,11 @@
     <name>MapView</name>
     <message>
         <source>This project has changes that are not saved yet. Save them first?</source>
-        <translation>Ce projet contient des modifications non enregistrées. Les enregistrer d&apos;abord ?</translation>
+        <translation>Ce projet contient des modifications non enregistrées. Les enregistrer d&apos;abord&#xa0;?</translation>
+    </message>
+    <message>
+        <source>Delete this avatar?</source>
+        <translation>Supprimer cet avatar ?</translation>
     </message>
 </context>
 <context>
@@ -325,7 +457,7 @@
     </message>
     <message>
         <source>No place found for “%1”.</source>
-        <translation>Aucun lieu trouvé pour « %1 ».</translation>
+        <translation>Aucun lieu trouvé pour «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>The place search did not work. Try again later.</source>
@@ -349,7 +481,7 @@
     <message>
         <source>%1 %</source>
         <extracomment>Share of the film exported so far</extracomment>
-        <translation>%1 %</translation>
+        <translation>%1&#xa0;%</translation>
     </message>
     <message>
         <source>Hide window</source>
@@ -436,7 +568,7 @@
     <message>
         <source>%1 px</source>
         <extracomment>A width in pixels on the screen</extracomment>
-        <translation>%1 px</translation>
+        <translation>%1&#xa0;px</translation>
     </message>
     <message>
         <source>Opacity</source>
@@ -444,7 +576,7 @@
     </message>
     <message>
         <source>%1 %</source>
-        <translation>%1 %</translation>
+        <translation>%1&#xa0;%</translation>
     </message>
     <message>
         <source>Shadow under the route</source>
@@ -476,6 +608,33 @@
     <message>
         <source>Close</source>
         <translation>Fermer</translation>
+    </message>
+    <message>
+        <source>Avatar</source>
+        <translation>Avatar</translation>
+    </message>
+</context>
+<context>
+    <name>TimelineBar</name>
+    <message>
+        <source>Stop the preview</source>
+        <translation>Arrêter l&apos;aperçu</translation>
+    </message>
+    <message>
+        <source>Play the preview</source>
+        <translation>Lire l&apos;aperçu</translation>
+    </message>
+    <message>
+        <source>Position in the film</source>
+        <translation>Position dans le film</translation>
+    </message>
+    <message>
+        <source>Settings of the film</source>
+        <translation>Réglages du film</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Plein écran</translation>
     </message>
 </context>
 <context>
@@ -518,7 +677,7 @@
     <message>
         <source>%1 %</source>
         <extracomment>A size in percent of the normal size</extracomment>
-        <translation>%1 %</translation>
+        <translation>%1&#xa0;%</translation>
     </message>
     <message>
         <source>Timing</source>
@@ -539,7 +698,7 @@
     <message>
         <source>Font: %1, %2 pt…</source>
         <extracomment>Opens the choice of a font; %1 is the font&apos;s name, %2 its size in points</extracomment>
-        <translation>Police : %1, %2 pt…</translation>
+        <translation>Police&#xa0;: %1, %2&#xa0;pt…</translation>
     </message>
     <message>
         <source>Font…</source>

@@ -2,6 +2,28 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="it_IT">
 <context>
+    <name>AvatarGrid</name>
+    <message>
+        <source>Delete this avatar</source>
+        <translation>Elimina questo avatar</translation>
+    </message>
+</context>
+<context>
+    <name>AvatarSettingsPage</name>
+    <message>
+        <source>Size</source>
+        <translation>Dimensione</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Turn with the road</source>
+        <translation>Ruota con la strada</translation>
+    </message>
+</context>
+<context>
     <name>DurationField</name>
     <message>
         <source>s</source>
@@ -18,6 +40,112 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPage</name>
+    <message>
+        <source>Length, of the longest film</source>
+        <translation>Durata, del film più lungo</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Longest film</source>
+        <translation>Film più lungo</translation>
+    </message>
+    <message>
+        <source>Even pace over the whole route</source>
+        <translation>Andatura costante su tutto il percorso</translation>
+    </message>
+    <message>
+        <source>Waypoints</source>
+        <translation>Tappe</translation>
+    </message>
+    <message>
+        <source>Appear when reached</source>
+        <translation>Appaiono quando raggiunte</translation>
+    </message>
+    <message>
+        <source>Pop up</source>
+        <translation>Comparsa animata</translation>
+    </message>
+    <message>
+        <source>Pop-up time</source>
+        <translation>Durata della comparsa</translation>
+    </message>
+    <message>
+        <source>%1 s</source>
+        <translation>%1 s</translation>
+    </message>
+    <message>
+        <source>No stops at waypoints</source>
+        <translation>Nessuna sosta alle tappe</translation>
+    </message>
+    <message>
+        <source>Camera</source>
+        <translation>Telecamera</translation>
+    </message>
+    <message>
+        <source>Still</source>
+        <extracomment>The camera stays where the user left the map</extracomment>
+        <translation>Fissa</translation>
+    </message>
+    <message>
+        <source>Follow</source>
+        <extracomment>The camera keeps the avatar in the middle</extracomment>
+        <translation>Segui</translation>
+    </message>
+    <message>
+        <source>Circle</source>
+        <extracomment>The camera follows, the map seen through a round frame</extracomment>
+        <translation>Cerchio</translation>
+    </message>
+    <message>
+        <source>Frame</source>
+        <extracomment>The camera follows, the map seen through a frame of a chosen shape</extracomment>
+        <translation>Cornice</translation>
+    </message>
+    <message>
+        <source>Fly in at the start</source>
+        <translation>Arrivo in volo all’inizio</translation>
+    </message>
+    <message>
+        <source>Fly-in</source>
+        <translation>Arrivo in volo</translation>
+    </message>
+    <message>
+        <source>Turn on the way</source>
+        <translation>Ruota durante il volo</translation>
+    </message>
+    <message>
+        <source>Turn by</source>
+        <translation>Ruota di</translation>
+    </message>
+    <message>
+        <source>%1°</source>
+        <translation>%1°</translation>
+    </message>
+    <message>
+        <source>Tilt on the way</source>
+        <translation>Inclina durante il volo</translation>
+    </message>
+    <message>
+        <source>Tilt to</source>
+        <translation>Inclina fino a</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPanel</name>
+    <message>
+        <source>Film</source>
+        <translation>Film</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Chiudi</translation>
     </message>
 </context>
 <context>
@@ -277,6 +405,10 @@
         <source>This project has changes that are not saved yet. Save them first?</source>
         <translation>Questo progetto contiene modifiche non ancora salvate. Salvarle prima?</translation>
     </message>
+    <message>
+        <source>Delete this avatar?</source>
+        <translation>Eliminare questo avatar?</translation>
+    </message>
 </context>
 <context>
     <name>MessageBox</name>
@@ -476,6 +608,33 @@
     <message>
         <source>Close</source>
         <translation>Chiudi</translation>
+    </message>
+    <message>
+        <source>Avatar</source>
+        <translation>Avatar</translation>
+    </message>
+</context>
+<context>
+    <name>TimelineBar</name>
+    <message>
+        <source>Stop the preview</source>
+        <translation>Ferma l’anteprima</translation>
+    </message>
+    <message>
+        <source>Play the preview</source>
+        <translation>Riproduci l’anteprima</translation>
+    </message>
+    <message>
+        <source>Position in the film</source>
+        <translation>Posizione nel film</translation>
+    </message>
+    <message>
+        <source>Settings of the film</source>
+        <translation>Impostazioni del film</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Schermo intero</translation>
     </message>
 </context>
 <context>

@@ -2,6 +2,28 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="ja_JP">
 <context>
+    <name>AvatarGrid</name>
+    <message>
+        <source>Delete this avatar</source>
+        <translation>このアバターを削除</translation>
+    </message>
+</context>
+<context>
+    <name>AvatarSettingsPage</name>
+    <message>
+        <source>Size</source>
+        <translation>サイズ</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Turn with the road</source>
+        <translation>道に沿って向きを変える</translation>
+    </message>
+</context>
+<context>
     <name>DurationField</name>
     <message>
         <source>s</source>
@@ -18,6 +40,112 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPage</name>
+    <message>
+        <source>Length, of the longest film</source>
+        <translation>長さ（最長の映像に対して）</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Longest film</source>
+        <translation>最長の映像</translation>
+    </message>
+    <message>
+        <source>Even pace over the whole route</source>
+        <translation>ルート全体を一定の速さで</translation>
+    </message>
+    <message>
+        <source>Waypoints</source>
+        <translation>ウェイポイント</translation>
+    </message>
+    <message>
+        <source>Appear when reached</source>
+        <translation>到着したら表示</translation>
+    </message>
+    <message>
+        <source>Pop up</source>
+        <translation>ポップアップ表示</translation>
+    </message>
+    <message>
+        <source>Pop-up time</source>
+        <translation>ポップアップの時間</translation>
+    </message>
+    <message>
+        <source>%1 s</source>
+        <translation>%1秒</translation>
+    </message>
+    <message>
+        <source>No stops at waypoints</source>
+        <translation>ウェイポイントで停止しない</translation>
+    </message>
+    <message>
+        <source>Camera</source>
+        <translation>カメラ</translation>
+    </message>
+    <message>
+        <source>Still</source>
+        <extracomment>The camera stays where the user left the map</extracomment>
+        <translation>固定</translation>
+    </message>
+    <message>
+        <source>Follow</source>
+        <extracomment>The camera keeps the avatar in the middle</extracomment>
+        <translation>追従</translation>
+    </message>
+    <message>
+        <source>Circle</source>
+        <extracomment>The camera follows, the map seen through a round frame</extracomment>
+        <translation>円</translation>
+    </message>
+    <message>
+        <source>Frame</source>
+        <extracomment>The camera follows, the map seen through a frame of a chosen shape</extracomment>
+        <translation>フレーム</translation>
+    </message>
+    <message>
+        <source>Fly in at the start</source>
+        <translation>最初に上空から近づく</translation>
+    </message>
+    <message>
+        <source>Fly-in</source>
+        <translation>接近</translation>
+    </message>
+    <message>
+        <source>Turn on the way</source>
+        <translation>途中で回転</translation>
+    </message>
+    <message>
+        <source>Turn by</source>
+        <translation>回転角</translation>
+    </message>
+    <message>
+        <source>%1°</source>
+        <translation>%1°</translation>
+    </message>
+    <message>
+        <source>Tilt on the way</source>
+        <translation>途中で傾ける</translation>
+    </message>
+    <message>
+        <source>Tilt to</source>
+        <translation>傾き</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPanel</name>
+    <message>
+        <source>Film</source>
+        <translation>映像</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>閉じる</translation>
     </message>
 </context>
 <context>
@@ -277,6 +405,10 @@
         <source>This project has changes that are not saved yet. Save them first?</source>
         <translation>このプロジェクトには保存されていない変更があります。先に保存しますか？</translation>
     </message>
+    <message>
+        <source>Delete this avatar?</source>
+        <translation>このアバターを削除しますか？</translation>
+    </message>
 </context>
 <context>
     <name>MessageBox</name>
@@ -476,6 +608,33 @@
     <message>
         <source>Close</source>
         <translation>閉じる</translation>
+    </message>
+    <message>
+        <source>Avatar</source>
+        <translation>アバター</translation>
+    </message>
+</context>
+<context>
+    <name>TimelineBar</name>
+    <message>
+        <source>Stop the preview</source>
+        <translation>プレビューを停止</translation>
+    </message>
+    <message>
+        <source>Play the preview</source>
+        <translation>プレビューを再生</translation>
+    </message>
+    <message>
+        <source>Position in the film</source>
+        <translation>映像内の位置</translation>
+    </message>
+    <message>
+        <source>Settings of the film</source>
+        <translation>映像の設定</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>全画面表示</translation>
     </message>
 </context>
 <context>

@@ -2,6 +2,28 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="nl_NL">
 <context>
+    <name>AvatarGrid</name>
+    <message>
+        <source>Delete this avatar</source>
+        <translation>Deze avatar verwijderen</translation>
+    </message>
+</context>
+<context>
+    <name>AvatarSettingsPage</name>
+    <message>
+        <source>Size</source>
+        <translation>Grootte</translation>
+    </message>
+    <message>
+        <source>%1 px</source>
+        <translation>%1 px</translation>
+    </message>
+    <message>
+        <source>Turn with the road</source>
+        <translation>Meedraaien met de weg</translation>
+    </message>
+</context>
+<context>
     <name>DurationField</name>
     <message>
         <source>s</source>
@@ -18,6 +40,112 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPage</name>
+    <message>
+        <source>Length, of the longest film</source>
+        <translation>Lengte, van de langste film</translation>
+    </message>
+    <message>
+        <source>%1 %</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Longest film</source>
+        <translation>Langste film</translation>
+    </message>
+    <message>
+        <source>Even pace over the whole route</source>
+        <translation>Gelijkmatig tempo over de hele route</translation>
+    </message>
+    <message>
+        <source>Waypoints</source>
+        <translation>Routepunten</translation>
+    </message>
+    <message>
+        <source>Appear when reached</source>
+        <translation>Verschijnen bij aankomst</translation>
+    </message>
+    <message>
+        <source>Pop up</source>
+        <translation>Laten opspringen</translation>
+    </message>
+    <message>
+        <source>Pop-up time</source>
+        <translation>Duur van het opspringen</translation>
+    </message>
+    <message>
+        <source>%1 s</source>
+        <translation>%1 s</translation>
+    </message>
+    <message>
+        <source>No stops at waypoints</source>
+        <translation>Niet stoppen bij routepunten</translation>
+    </message>
+    <message>
+        <source>Camera</source>
+        <translation>Camera</translation>
+    </message>
+    <message>
+        <source>Still</source>
+        <extracomment>The camera stays where the user left the map</extracomment>
+        <translation>Vast</translation>
+    </message>
+    <message>
+        <source>Follow</source>
+        <extracomment>The camera keeps the avatar in the middle</extracomment>
+        <translation>Volgen</translation>
+    </message>
+    <message>
+        <source>Circle</source>
+        <extracomment>The camera follows, the map seen through a round frame</extracomment>
+        <translation>Cirkel</translation>
+    </message>
+    <message>
+        <source>Frame</source>
+        <extracomment>The camera follows, the map seen through a frame of a chosen shape</extracomment>
+        <translation>Kader</translation>
+    </message>
+    <message>
+        <source>Fly in at the start</source>
+        <translation>Aan het begin invliegen</translation>
+    </message>
+    <message>
+        <source>Fly-in</source>
+        <translation>Invliegen</translation>
+    </message>
+    <message>
+        <source>Turn on the way</source>
+        <translation>Onderweg draaien</translation>
+    </message>
+    <message>
+        <source>Turn by</source>
+        <translation>Draaien met</translation>
+    </message>
+    <message>
+        <source>%1°</source>
+        <translation>%1°</translation>
+    </message>
+    <message>
+        <source>Tilt on the way</source>
+        <translation>Onderweg kantelen</translation>
+    </message>
+    <message>
+        <source>Tilt to</source>
+        <translation>Kantelen tot</translation>
+    </message>
+</context>
+<context>
+    <name>FilmSettingsPanel</name>
+    <message>
+        <source>Film</source>
+        <translation>Film</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Sluiten</translation>
     </message>
 </context>
 <context>
@@ -277,6 +405,10 @@
         <source>This project has changes that are not saved yet. Save them first?</source>
         <translation>Dit project bevat wijzigingen die nog niet zijn opgeslagen. Eerst opslaan?</translation>
     </message>
+    <message>
+        <source>Delete this avatar?</source>
+        <translation>Deze avatar verwijderen?</translation>
+    </message>
 </context>
 <context>
     <name>MessageBox</name>
@@ -476,6 +608,33 @@
     <message>
         <source>Close</source>
         <translation>Sluiten</translation>
+    </message>
+    <message>
+        <source>Avatar</source>
+        <translation>Avatar</translation>
+    </message>
+</context>
+<context>
+    <name>TimelineBar</name>
+    <message>
+        <source>Stop the preview</source>
+        <translation>Voorbeeld stoppen</translation>
+    </message>
+    <message>
+        <source>Play the preview</source>
+        <translation>Voorbeeld afspelen</translation>
+    </message>
+    <message>
+        <source>Position in the film</source>
+        <translation>Positie in de film</translation>
+    </message>
+    <message>
+        <source>Settings of the film</source>
+        <translation>Instellingen van de film</translation>
+    </message>
+    <message>
+        <source>Full screen</source>
+        <translation>Volledig scherm</translation>
     </message>
 </context>
 <context>
