@@ -58,7 +58,7 @@
     </message>
     <message>
         <source>Even pace over the whole route</source>
-        <translation>Gleichmäßiges Tempo auf der ganzen Route</translation>
+        <translation>Gleichmäßiges Tempo</translation>
     </message>
     <message>
         <source>Waypoints</source>

@@ -603,7 +603,7 @@
     </message>
     <message>
         <source>Waypoint</source>
-        <translation>ウェイポイント</translation>
+        <translation>経由地</translation>
     </message>
     <message>
         <source>Close</source>
