@@ -181,7 +181,9 @@ void MapView::initPilotModel(QObject *root)
     connect(&m_keyPointItemsModel, &QKeyPointItemsModel::activeKeyPointIdChanged, &m_pilotItemsModel,
             &QPilotItemsModel::activeKeyPointIdChanged);
     connect(&m_pilotItemsModel, &QPilotItemsModel::projectIsModified, this, &MapView::projectIsModified);
-    connect(&m_pilotItemsModel, &QPilotItemsModel::showError, this, &MapView::DoShowError);
+    // The model names its message by the key of the interface's text.
+    connect(&m_pilotItemsModel, &QPilotItemsModel::showError, this,
+            [this](const QString &key) { DoShowError(m_mainController.getString(key)); });
 }
 
 void MapView::connectSignalList(QObject *signalList)

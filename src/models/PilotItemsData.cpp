@@ -231,6 +231,19 @@ QString PilotItemsData::dataFolder() const
     return m_settings.pathSetting(SettingsKey::DynamicContentPath);
 }
 
+// The interface's text for the last failed import: an archive that can't be found or
+// opened, or one that holds no usable picture series.
+QString PilotItemsData::importErrorKey()
+{
+    switch (importErrorNumber()) {
+    case 3:   // no such file
+    case 110: // could not be opened
+        return QStringLiteral("strErrorOpenFile");
+    default:
+        return QStringLiteral("strErrorWrongFileStructure");
+    }
+}
+
 std::optional<PilotProperties> PilotItemsData::pilotOfUserFile(const QString &file)
 {
     PilotProperties pilot;
@@ -239,7 +252,8 @@ std::optional<PilotProperties> PilotItemsData::pilotOfUserFile(const QString &fi
     if (isZipAvatar(file)) {
         QString picture;
         if (!importZipAvatar(dataFolder(), file, picture)) {
-            m_browseError = importErrorText();
+            logTrace(3, QStringLiteral("PilotItemsData::pilotOfUserFile - %s: %s"), file, importErrorText());
+            m_browseError = importErrorKey();
             return std::nullopt;
         }
         pilot.thumb = contentFileUrl(picture);
@@ -251,7 +265,7 @@ std::optional<PilotProperties> PilotItemsData::pilotOfUserFile(const QString &fi
     QImageReader reader(file);
     if (!reader.canRead()) {
         logTrace(3, QStringLiteral("PilotItemsData::pilotOfUserFile - no picture in %s: %s"), file, reader.errorString());
-        m_browseError = QStringLiteral("The file %1 is not a picture that can be shown.").arg(QFileInfo(file).fileName());
+        m_browseError = QStringLiteral("strErrorWrongFileStructure");
         return std::nullopt;
     }
     pilot.setFlag(PilotProperties::isAnimated, reader.supportsAnimation() && reader.imageCount() > 1);

@@ -87,7 +87,8 @@ public:
     // Applies the avatar of the row with this id; false for an unknown id or the browse row.
     bool changePilotItem(uint32_t pilotId);
     // Asks for a file of the user's own and applies it. Nothing when cancelled or when
-    // it could not be used; then browseError() tells why (empty when cancelled).
+    // it could not be used; then browseError() gives the key of the interface's text
+    // that tells why (empty when cancelled).
     std::optional<PilotItem> browseUserPilot();
     QString browseError() const { return m_browseError; }
     // Puts an item made by browseUserPilot at userItemRow (or at the end of a shorter list).
@@ -121,6 +122,7 @@ private:
     bool applyPilot(const PilotProperties &pilot, const QString &trackingWord);
     std::optional<PilotProperties> pilotOfUserFile(const QString &file);
     QString dataFolder() const;
+    static QString importErrorKey();
 
     PainterPathRenderer_Controller *m_document;
     AppSettings m_settings;

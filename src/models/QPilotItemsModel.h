@@ -62,6 +62,7 @@ signals:
     void pilotGroupsChanged();
     void currentPilotChanged();
     void pilotMirroringAnimationDurationChanged();
+    // `text` is the key of the interface's text, which the map view looks up.
     void showError(QString text);
     void activeGroupChanged();
     void projectIsModified();
