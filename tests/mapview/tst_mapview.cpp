@@ -502,7 +502,7 @@ void tst_MapView::previewStopsOnClickAndRestoresTheView()
     // A click stops it after 300 ms, and the next tick brings the user's view back.
     QSignalSpy restored(&stage.view, &MapView::locationSettingsChanged);
     QCoreApplication::sendEvent(&stage.view, &release);
-    QTest::qWait(150);
+    QTest::qWait(100);
     QVERIFY(stage.view.animationRunning());
     QTRY_VERIFY(!stage.view.animationRunning());
     QTRY_VERIFY(!restored.isEmpty());
