@@ -1,6 +1,7 @@
 #include "app/AppSettings.h"
 #include "app/gui/PainterPathRenderWidget.h"
 #include "mapview/MapView.h"
+#include "mapview/ProgramResources.h"
 #include "project/PainterPathRenderer_Controller.h"
 
 #include <QApplication>
@@ -32,7 +33,7 @@ int main(int argc, char *argv[])
     const int seconds = argc > 1 ? std::max(1, atoi(argv[1])) : 10;
     QCoreApplication::setApplicationName(QStringLiteral("Tourlet"));
     QDir::setCurrent(QCoreApplication::applicationDirPath());
-    if (!QResource::registerResource(QStringLiteral("resource.rcc"))) {
+    if (!registerProgramResources(QCoreApplication::applicationDirPath())) {
         out << "no resource.rcc beside the program\n";
         return 1;
     }

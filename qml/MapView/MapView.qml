@@ -92,6 +92,7 @@ Item {
         objectName: "mapStage"
         anchors.fill: parent
         locationSettings: host.locationSettings
+        baseMapStyle: host.offlineMapStyle !== undefined ? host.offlineMapStyle : ""
         onViewMoved: {
             signalList.setCenterPosition(center.latitude, center.longitude)
             signalList.saveBoundaries(topLeft.longitude, topLeft.latitude,

@@ -153,7 +153,8 @@ Item {
     Component {
         id: lineComponent
         RouteLine {
-            objectName: "routeSegment"
+            // Names are unique: the vector map makes a layer of each line by its name.
+            objectName: "routeSegment_" + segmentId
             z: 2
             line.color: route.lineColor
             line.width: route.lineWidth
@@ -164,7 +165,7 @@ Item {
     Component {
         id: shadowComponent
         RouteLine {
-            objectName: "routeSegmentShadow"
+            objectName: "routeSegmentShadow_" + segmentId
             z: 1
             line.color: Theme.routeShadow
             line.width: route.lineWidth + route.shadowWidth

@@ -13,6 +13,8 @@ Item {
     // host.locationSettings: "centerLongitude", "centerLatitude", "zoomLevel",
     // "bearing", "tilt"
     property var locationSettings: ({})
+    // The offline world map's style; without one the map shows its ground colour and grid.
+    property string baseMapStyle: ""
     readonly property alias map: mapLoader.item
 
     // The waypoint model, null until the map view has set it
@@ -91,6 +93,37 @@ Item {
     }
 
     onLocationSettingsChanged: applyLocationSettings()
+
+    // No network: the offline world map drawn from the program's own vector tiles, or
+    // only the ground colour and the grid. The route lies under the country names.
+    // Only the plugin in use is made: one left unused complains as it goes.
+    // Held in a plain object, so that making it is no change the map would react to.
+    readonly property var made: ({})
+    function pluginInUse() {
+        if (!made.plugin)
+            made.plugin = (baseMapStyle !== "" ? worldPlugin : overlayPlugin).createObject(stage)
+        return made.plugin
+    }
+    Component {
+        id: worldPlugin
+        Plugin {
+            name: "mapboxgl"
+            PluginParameter {
+                name: "mapboxgl.mapping.additional_style_urls"
+                value: stage.baseMapStyle
+            }
+            PluginParameter {
+                name: "mapboxgl.mapping.items.insert_before"
+                value: "country-names-large"
+            }
+        }
+    }
+    Component {
+        id: overlayPlugin
+        Plugin {
+            name: "itemsoverlay"
+        }
+    }
     onAnimationCameraChanged: {
         if (playing)
             applyView(animationCamera)
@@ -109,10 +142,11 @@ Item {
             objectName: "worldMap"
             color: Theme.mapBackground
             copyrightsVisible: false
-            // No tiles and no network: the ground colour, the grid and what the
-            // program draws on the map.
-            plugin: Plugin {
-                name: "itemsoverlay"
+            plugin: stage.pluginInUse()
+            // The offline style is the first map type the plugin offers.
+            Component.onCompleted: {
+                if (stage.baseMapStyle !== "" && supportedMapTypes.length > 0)
+                    activeMapType = supportedMapTypes[0]
             }
 
             property alias routeLayer: routeLayer
@@ -164,7 +198,7 @@ Item {
                 anchors.fill: parent
                 z: 0.5
                 map: geoMap
-                visible: geoMap.bearing === 0 && geoMap.tilt === 0
+                visible: stage.baseMapStyle === "" && geoMap.bearing === 0 && geoMap.tilt === 0
             }
 
             RouteSegments {

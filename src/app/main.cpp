@@ -8,6 +8,7 @@
 #include "app/Trace.h"
 #include "app/Translators.h"
 #include "app/gui/PainterPathRenderWidget.h"
+#include "mapview/ProgramResources.h"
 #include "app/gui/StartupSplash.h"
 #include "mapview/MapView.h"
 #include "platform/SingleInstance.h"
@@ -76,7 +77,7 @@ int main(int argc, char *argv[])
     QDir::setCurrent(programDir);
     QGuiApplication::setQuitOnLastWindowClosed(false);
     QCoreApplication::setApplicationName(QStringLiteral("Tourlet"));
-    QResource::registerResource(QStringLiteral("resource.rcc"), QString());
+    registerProgramResources(programDir);
     QApplication::setWindowIcon(QIcon(QStringLiteral(":/Qml/images/QZkGeo.png")));
     QQuickStyle::setStyle(QStringLiteral("Material"));
 

@@ -11,6 +11,7 @@
 #include "app/gui/StartupSplash.h"
 #include "mapview/QtKeyPointDialogs.h"
 #include "mapview/QtPilotDialogs.h"
+#include "mapview/ProgramResources.h"
 #include "gpx/GpxWriter.h"
 #include "path/PathMode.h"
 #include "project/DocumentAnimationSource.h"
@@ -172,6 +173,11 @@ void MapView::initKeyPointModels(QObject *root)
     connect(&m_keyPointItemsModel, &QKeyPointItemsModel::triggerLoadState, this, &MapView::triggerLoadState);
     connect(this, &MapView::setActiveKeyPointId, &m_keyPointItemsModel, &QKeyPointItemsModel::setActiveKeyPointId);
     rootContext()->setContextProperty(QStringLiteral("keyPointImageItemsModel"), &m_keyPointImageItemsModel);
+}
+
+QString MapView::offlineMapStyle() const
+{
+    return offlineWorldMapStyle();
 }
 
 void MapView::initPilotModel(QObject *root)

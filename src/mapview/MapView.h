@@ -43,6 +43,8 @@ class MapView : public QQuickView, private VisibleRegionProvider
     Q_PROPERTY(double scalingFactor READ scalingFactor CONSTANT)
     Q_PROPERTY(QString mapFrameSource READ mapFrameSource NOTIFY mapFrameSourceChanged)
     Q_PROPERTY(bool showOptions READ showOptions NOTIFY showOptionsChanged)
+    // The style of the offline world map under the route; empty without one.
+    Q_PROPERTY(QString offlineMapStyle READ offlineMapStyle CONSTANT)
 
     // Hover and marker
     Q_PROPERTY(bool mouseOverPath READ mouseOverPath NOTIFY mouseOverPathChanged)
@@ -172,6 +174,7 @@ public:
     double scalingFactor() const;
     QString mapFrameSource() const;
     bool showOptions() const { return m_showOptions; }
+    QString offlineMapStyle() const;
 
     bool mouseOverPath() const { return m_mouseOverPath; }
     QGeoCoordinate mouseOverPathPosition() const { return m_mouseOverPathPosition; }

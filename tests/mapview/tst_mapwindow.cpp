@@ -1,10 +1,12 @@
 #include "TestFiles.h"
 
 #include "mapview/MapView.h"
+#include "mapview/ProgramResources.h"
 #include "project/PainterPathRenderer_Controller.h"
 
 #include <QGeoCoordinate>
 #include <QQuickItem>
+#include <QFileInfo>
 #include <QResource>
 #include <QSettings>
 #include <QSignalSpy>
@@ -49,13 +51,13 @@ private slots:
     void failedLoadShowsTheErrorBox();
 
 private:
-    // Items of the map's scene with this object name that are on the map.
+    // Items of the map's scene whose object name begins with `name` that are on the map.
     int onMap(const char *name) const
     {
         QObject *map = m_view->rootObject()->findChild<QObject *>("worldMap");
         const auto items = map ? map->property("mapItems").value<QList<QObject *>>() : QList<QObject *>();
         return int(std::count_if(items.begin(), items.end(),
-                                 [name](const QObject *item) { return item->objectName() == QLatin1String(name); }));
+                                 [name](const QObject *item) { return item->objectName().startsWith(QLatin1String(name)); }));
     }
     // A popup of the interface is up.
     bool shown(const char *name) const
@@ -78,9 +80,9 @@ private:
 
 void tst_MapWindow::initTestCase()
 {
-    QVERIFY(QResource::registerResource(QStringLiteral(TOURLET_RESOURCE)));
     QCoreApplication::setApplicationName(QStringLiteral("Tourlet"));
     defaultHandler = qInstallMessageHandler(collectWarnings);
+    QVERIFY(registerProgramResources(QFileInfo(QStringLiteral(TOURLET_RESOURCE)).path()));
 
     m_store = std::make_unique<QSettings>(m_dir.filePath(QStringLiteral("settings.ini")), QSettings::IniFormat);
     m_view = std::make_unique<MapView>(&m_document, nullptr, AppSettings(*m_store));
@@ -140,7 +142,7 @@ void tst_MapWindow::trackOpensOnTheMap()
     // The route and its waypoints are drawn: a line per segment, a marker per key point.
     const Path &path = *m_document.pathManager().active();
     QVERIFY(path.keyPoints.size() >= 2);
-    QCOMPARE(onMap("routeSegment"), int(path.pathSegments.size()));
+    QCOMPARE(onMap("routeSegment_"), int(path.pathSegments.size()));
     QCOMPARE(onMap("waypointMarker"), int(path.keyPoints.size()));
 }
 

@@ -5,7 +5,10 @@ function findAll(object, name, found) {
     found = found || []
     if (!object)
         return found
-    if (object.objectName === name)
+    // A name ending in "_" stands for all names that begin with it.
+    var matches = name.charAt(name.length - 1) === "_" ? String(object.objectName).indexOf(name) === 0
+                                                        : object.objectName === name
+    if (matches)
         found.push(object)
     var next = []
     var list = object.data !== undefined ? object.data : object.children

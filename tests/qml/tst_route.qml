@@ -121,9 +121,9 @@ Item {
             var route = world.routeLayer
             compare(route.segmentIds, data.ids)
             // Removed lines leave the map at once; destroy() frees them later.
-            var lines = Scene.findAll(map, "routeSegment").filter(function (l) { return map.mapItems.indexOf(l) >= 0 })
+            var lines = Scene.findAll(map, "routeSegment_").filter(function (l) { return map.mapItems.indexOf(l) >= 0 })
             compare(lines.length, data.ids.length)
-            var shadows = Scene.findAll(map, "routeSegmentShadow").filter(function (l) { return map.mapItems.indexOf(l) >= 0 })
+            var shadows = Scene.findAll(map, "routeSegmentShadow_").filter(function (l) { return map.mapItems.indexOf(l) >= 0 })
             compare(shadows.length, data.shadows !== undefined ? data.shadows : data.shadow ? data.ids.length : 0)
             for (var i = 0; i < data.ids.length; ++i) {
                 var line = route.lineOf(data.ids[i])

@@ -2,6 +2,7 @@
 #include "app/Translators.h"
 #include "app/gui/PainterPathRenderWidget.h"
 #include "mapview/MapView.h"
+#include "mapview/ProgramResources.h"
 
 #include <QApplication>
 #include <QCursor>
@@ -162,7 +163,7 @@ int main(int argc, char *argv[])
     QCoreApplication::setApplicationName(QStringLiteral("Tourlet"));
     QDir::setCurrent(programDir);
     QGuiApplication::setQuitOnLastWindowClosed(false);
-    if (!QResource::registerResource(QStringLiteral("resource.rcc"))) {
+    if (!registerProgramResources(programDir)) {
         err() << "no resource.rcc in " << programDir << "\n";
         return 1;
     }

@@ -1,0 +1,15 @@
+# Writes the resource list of the offline world map (every file below BASEMAP_DIR,
+# under the prefix /basemap) and packs it into OUTPUT with rcc.
+file(GLOB_RECURSE files RELATIVE ${BASEMAP_DIR} ${BASEMAP_DIR}/*)
+list(FILTER files EXCLUDE REGEX "metadata\\.json$")
+list(SORT files)
+set(text "<!DOCTYPE RCC><RCC version=\"1.0\">\n<qresource prefix=\"/basemap\">\n")
+foreach(f ${files})
+  string(APPEND text "  <file alias=\"${f}\">${BASEMAP_DIR}/${f}</file>\n")
+endforeach()
+string(APPEND text "</qresource>\n</RCC>\n")
+file(WRITE ${QRC} "${text}")
+execute_process(COMMAND ${RCC} --binary --no-compress --output ${OUTPUT} ${QRC} RESULT_VARIABLE failed)
+if(failed)
+  message(FATAL_ERROR "rcc could not pack the world map")
+endif()
