@@ -47,6 +47,8 @@ private slots:
     void interfaceHandsOverItsStrings();
     void trackOpensOnTheMap();
     void previewCameraFollowsTheAvatar();
+    void offlineMapShowsLandAndWater_data();
+    void offlineMapShowsLandAndWater();
     void clickOnTheMapAddsAWaypointThatASaveKeeps();
     void failedLoadShowsTheErrorBox();
 
@@ -178,8 +180,85 @@ void tst_MapWindow::previewCameraFollowsTheAvatar()
     }
     QVERIFY2(moved >= frames.size() / 2, qPrintable(QString::number(moved)));
 
+    // Stopped, the map goes back to the view the user left.
+    QSignalSpy restored(m_view.get(), &MapView::locationSettingsChanged);
     m_view->stopAnimation(true);
     QTRY_VERIFY(!avatar->property("visible").toBool());
+    QTRY_VERIFY(!restored.isEmpty());
+}
+
+namespace {
+
+// The world map's colours (content/basemap/style.json).
+const QColor land(0xEF, 0xEB, 0xE3);
+const QColor water(0xA9, 0xCB, 0xE0);
+const QColor border(0x9A, 0x8F, 0x80);
+
+bool near(const QColor &a, const QColor &b, int tolerance = 10)
+{
+    return std::abs(a.red() - b.red()) <= tolerance && std::abs(a.green() - b.green()) <= tolerance &&
+           std::abs(a.blue() - b.blue()) <= tolerance;
+}
+
+} // namespace
+
+void tst_MapWindow::offlineMapShowsLandAndWater_data()
+{
+    QTest::addColumn<double>("zoom");
+    QTest::addColumn<QGeoCoordinate>("centre");
+    QTest::addColumn<QList<QGeoCoordinate>>("onLand");
+    QTest::addColumn<QList<QGeoCoordinate>>("onWater");
+    // A line that crosses a country border, or none
+    QTest::addColumn<QList<QGeoCoordinate>>("acrossBorder");
+
+    QTest::newRow("the world, zoom 2")
+        << 2.0 << QGeoCoordinate(0, 10)
+        << QList<QGeoCoordinate>{{0, 22}, {-10, -50}, {-25, 134}, {60, 90}}
+        << QList<QGeoCoordinate>{{-20, -15}, {-15, 75}, {-40, 160}, {20, -45}} << QList<QGeoCoordinate>{};
+    QTest::newRow("Marseille, zoom 8")
+        << 8.0 << QGeoCoordinate(43.3, 5.4)
+        << QList<QGeoCoordinate>{{43.55, 5.45}, {43.6, 4.9}, {43.5, 6.1}}
+        << QList<QGeoCoordinate>{{43.05, 5.4}, {43.1, 4.8}, {43.0, 6.0}} << QList<QGeoCoordinate>{};
+    // The Rhine between France and Germany, north of Basel
+    QTest::newRow("the upper Rhine, zoom 6")
+        << 6.0 << QGeoCoordinate(48.0, 7.6) << QList<QGeoCoordinate>{{48.3, 7.0}, {48.3, 8.3}}
+        << QList<QGeoCoordinate>{} << QList<QGeoCoordinate>{{48.3, 7.3}, {48.3, 7.9}};
+}
+
+// No network: the map is the program's own, with land and water where they are.
+void tst_MapWindow::offlineMapShowsLandAndWater()
+{
+    QFETCH(double, zoom);
+    QFETCH(QGeoCoordinate, centre);
+    QFETCH(QList<QGeoCoordinate>, onLand);
+    QFETCH(QList<QGeoCoordinate>, onWater);
+    QFETCH(QList<QGeoCoordinate>, acrossBorder);
+    QVERIFY(!m_view->offlineMapStyle().isEmpty());
+    QObject *map = m_view->rootObject()->findChild<QObject *>("worldMap");
+    QVERIFY(map);
+    map->setProperty("center", QVariant::fromValue(centre));
+    map->setProperty("zoomLevel", zoom);
+
+    const auto colourAt = [map](const QImage &shot, const QGeoCoordinate &place) {
+        QPointF at;
+        QMetaObject::invokeMethod(map, "fromCoordinate", Q_RETURN_ARG(QPointF, at),
+                                  Q_ARG(QGeoCoordinate, place), Q_ARG(bool, false));
+        return shot.pixelColor(at.toPoint());
+    };
+    // The map says nothing when its tiles are drawn: it is looked at until it is right.
+    const auto rightEverywhere = [&] {
+        const QImage shot = m_view->grabWindow();
+        bool borderSeen = acrossBorder.isEmpty();
+        for (int i = 0; i <= 100 && !borderSeen; ++i) {
+            const QGeoCoordinate &a = acrossBorder[0], &b = acrossBorder[1];
+            const QGeoCoordinate p(a.latitude(), a.longitude() + (b.longitude() - a.longitude()) * i / 100.0);
+            borderSeen = near(colourAt(shot, p), border, 25);
+        }
+        return borderSeen &&
+               std::all_of(onLand.begin(), onLand.end(), [&](const auto &p) { return near(colourAt(shot, p), land); }) &&
+               std::all_of(onWater.begin(), onWater.end(), [&](const auto &p) { return near(colourAt(shot, p), water); });
+    };
+    QTRY_VERIFY_WITH_TIMEOUT(rightEverywhere(), 10000);
 }
 
 void tst_MapWindow::failedLoadShowsTheErrorBox()
