@@ -113,6 +113,18 @@ public:
         return QTest::qWaitFor([&] { return !done.isEmpty() || !failed.isEmpty(); }, 10000);
     }
 
+    // The map alone at a zoom over a place; the vector map draws in about a second.
+    bool showMap(double latitude, double longitude, double zoom) const
+    {
+        QObject *map = find("worldMap");
+        if (!map)
+            return false;
+        map->setProperty("center", QVariant::fromValue(QGeoCoordinate(latitude, longitude)));
+        map->setProperty("zoomLevel", zoom);
+        QTest::qWait(1500);
+        return true;
+    }
+
     // Lets the map draw and transitions end.
     static void settle() { QTest::qWait(700); }
 
@@ -174,6 +186,9 @@ int main(int argc, char *argv[])
     const QList<State> states = {
         {"window", [](Stage &) { return true; }},
         {"track", [&](Stage &s) { return s.openFile(track); }},
+        {"map-world", [](Stage &s) { return s.showMap(25.0, 10.0, 2.2); }},
+        {"map-region", [](Stage &s) { return s.showMap(47.0, 9.0, 6.0); }},
+        {"map-close", [](Stage &s) { return s.showMap(46.95, 7.6, 10.0); }},
         // Half-way between the second and the third town, the camera on the avatar.
         {"playback",
          [](Stage &s) {
