@@ -120,6 +120,9 @@ void MapView::init(QWidget *window, bool hide, const QUrl &source)
     initLists();
     initKeyPointModels(root);
     initPilotModel(root);
+    m_backgroundChooser.connectSignalList(root);
+    rootContext()->setContextProperty(QStringLiteral("bgc_host"), &m_backgroundChooser);
+    connect(&m_backgroundChooser, &QBackgroundChooser::projectIsModified, this, &MapView::projectIsModified);
     showSplashMessage(SplashMessage::InitTracking);
     showSplashMessage(SplashMessage::ConnectQml);
 
@@ -154,6 +157,8 @@ void MapView::initLists()
     pilots.setDialogs(std::make_unique<QtPilotDialogs>(m_mainController, m_window));
     m_pilotItemsModel.setData(&pilots);
     m_pilotItemsModel.fill(catalogue, browseTitle());
+    // The live layers join the tree once the interface can name them.
+    m_backgroundChooser.buildTree(catalogue.maps(), {}, {});
 }
 
 QString MapView::browseTitle() const

@@ -4,6 +4,7 @@
 #include "animation/PlaybackCamera.h"
 #include "animation/PlaybackLoop.h"
 #include "animation/VisibleRegionProvider.h"
+#include "mapview/QBackgroundChooser.h"
 #include "mapview/QMainController.h"
 #include "project/DocumentAnimationSource.h"
 #include "models/QKeyPointImageItemsModel.h"
@@ -156,6 +157,7 @@ public:
     QKeyPointItemsModel &keyPointItemsModel() { return m_keyPointItemsModel; }
     QKeyPointImageItemsModel &keyPointImageItemsModel() { return m_keyPointImageItemsModel; }
     QPilotItemsModel &pilotItemsModel() { return m_pilotItemsModel; }
+    QBackgroundChooser &backgroundChooser() { return m_backgroundChooser; }
 
     // The zoom level at which an extent of `current` degrees fills a view that showed
     // `target` degrees at `zoom`. The result lies in the map's range of zoom levels.
@@ -465,9 +467,9 @@ private:
     // Frames of the chosen film length.
     int32_t chosenFrames() const;
 
-    // Members are made in the order of ownership and go in reverse. The exporter and
-    // the background chooser take their places ahead of the main controller, the usage
-    // tracking and the item models theirs at the end.
+    // Members are made in the order of ownership and go in reverse. The item models,
+    // the background chooser and the playback, which use the main controller and the
+    // document, come at the end; the exporter and the usage tracking will join them.
     QWidget *m_container = nullptr; // the embedding widget, a child of the window
     QMainController m_mainController;
     PainterPathRenderer_Controller *m_document;
@@ -504,6 +506,7 @@ private:
     QKeyPointItemsModel m_keyPointItemsModel;
     QKeyPointImageItemsModel m_keyPointImageItemsModel;
     QPilotItemsModel m_pilotItemsModel;
+    QBackgroundChooser m_backgroundChooser{m_mainController, *m_document};
 
     DocumentAnimationSource m_animationSource;
     AnimationEventList m_eventList;
