@@ -508,12 +508,18 @@ void MapView::delayedLoadProjectFinish()
 
     const Path *path = m_document->pathManager().active();
     const int32_t pathType = path ? path->pathType : PathType::Ordinary;
+    // A track goes onto the default map; a map that this installation lacks ("???...")
+    // stays named, so that a project keeps it for where it is found.
+    const QString background = fields.backgroundMap;
+    if (pathType == PathType::GPX && background.size() > 3 && !background.startsWith(QLatin1String("???")))
+        m_backgroundChooser.selectBackground(BackgroundSelection::defaultMap);
 
     m_keyPointItemsModel.loadKeyPoints();
     // The avatar page shows the avatar of the loaded project.
     m_pilotItemsModel.activeKeyPointIdChanged();
 
     setProjectModified(false);
+    m_backgroundChooser.refresh();
     emit mapFrameSourceChanged();
     emit showCompassChanged();
     emit animationDurationChanged();

@@ -109,6 +109,8 @@ private slots:
     void pointerHover();
     void trackMarkerSlidesBetweenLockedEnds();
     void previewStopsOnClickAndRestoresTheView();
+    void trackProjectLoadsOntoTheDefaultMap_data();
+    void trackProjectLoadsOntoTheDefaultMap();
 };
 
 void tst_MapView::messageBoxActions_data()
@@ -509,4 +511,30 @@ void tst_MapView::previewStopsOnClickAndRestoresTheView()
     QCOMPARE(fields.currentZoomLevel, 16.0);
     QCOMPARE(stage.view.locationSettings().value(QStringLiteral("zoomLevel")).toDouble(), 16.0);
     QCOMPARE(stage.view.locationSettings().value(QStringLiteral("bearing")).toDouble(), 10.0);
+}
+
+void tst_MapView::trackProjectLoadsOntoTheDefaultMap_data()
+{
+    QTest::addColumn<QString>("saved");
+    QTest::addColumn<QString>("loaded");
+    QTest::newRow("a catalogue map") << "pseudeo:map:alps" << "osm:layer:0";
+    QTest::newRow("a map this installation lacks stays") << "???esri:topo" << "???esri:topo";
+    QTest::newRow("too short to be a map") << "osm" << "osm";
+}
+
+void tst_MapView::trackProjectLoadsOntoTheDefaultMap()
+{
+    QFETCH(QString, saved);
+    QFETCH(QString, loaded);
+    Stage stage;
+    stage.view.openFile(writeTestFile(stage.dir, QStringLiteral("ride.gpx"), ride));
+    QVERIFY(stage.waitForLoad());
+    stage.document.fields().backgroundMap = saved;
+    stage.dialogs->answers << stage.file(QStringLiteral("ride.zkgeo"));
+    QVERIFY(stage.view.saveProject());
+
+    stage.view.openFile(stage.file(QStringLiteral("ride.zkgeo")));
+    QVERIFY(stage.waitForLoad());
+    QCOMPARE(stage.view.backgroundChooser().backgroundMap(), loaded);
+    QVERIFY(!stage.view.projectModified());
 }
