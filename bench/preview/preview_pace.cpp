@@ -21,6 +21,7 @@
 // events shown, and the frames that show an event not shown before.
 //
 //   preview-pace [SECONDS]
+//   preview-pace --first-screen    how long until the map's first screen is painted
 
 int main(int argc, char *argv[])
 {
@@ -30,7 +31,8 @@ int main(int argc, char *argv[])
         if (type >= QtWarningMsg)
             QTextStream(stderr) << text << '\n';
     });
-    const int seconds = argc > 1 ? std::max(1, atoi(argv[1])) : 10;
+    const bool firstScreen = argc > 1 && QByteArray(argv[1]) == "--first-screen";
+    const int seconds = argc > 1 && !firstScreen ? std::max(1, atoi(argv[1])) : 10;
     QCoreApplication::setApplicationName(QStringLiteral("Tourlet"));
     QDir::setCurrent(QCoreApplication::applicationDirPath());
     if (!registerProgramResources(QCoreApplication::applicationDirPath())) {
@@ -39,6 +41,8 @@ int main(int argc, char *argv[])
     }
     QQuickStyle::setStyle(QStringLiteral("Material"));
 
+    QElapsedTimer start;
+    start.start();
     PainterPathRenderWidget window(1.0);
     window.init();
     window.show();
@@ -47,6 +51,23 @@ int main(int argc, char *argv[])
         return 1;
     }
     MapView &view = *window.mapView();
+    if (firstScreen) {
+        // Painted when the middle of the view shows the world map's land or water.
+        const auto painted = [&view] {
+            const QImage shot = view.grabWindow();
+            const QColor c = shot.pixelColor(shot.width() / 2, shot.height() / 2);
+            const auto near = [&c](const QColor &b) {
+                return std::abs(c.red() - b.red()) < 10 && std::abs(c.green() - b.green()) < 10 &&
+                       std::abs(c.blue() - b.blue()) < 10;
+            };
+            return near(QColor(0xEF, 0xEB, 0xE3)) || near(QColor(0xA9, 0xCB, 0xE0));
+        };
+        const qint64 shown = start.elapsed();
+        while (!painted() && start.elapsed() < 10000)
+            QTest::qWait(20);
+        out << "window shown after " << shown << " ms, map painted after " << start.elapsed() << " ms\n";
+        return 0;
+    }
 
     // 200 waypoints on a winding way through the Alps, some 2 km apart.
     QElapsedTimer clock;
