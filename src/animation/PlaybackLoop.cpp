@@ -147,11 +147,3 @@ void PlaybackLoop::seek(double to)
     m_origin = m_clock() - qint64(std::trunc(total() * to));
     m_lastEventWasMedia = false;
 }
-
-void PlaybackLoop::rewind()
-{
-    ++m_generation;
-    m_manualAnimationActive = false;
-    m_animationEventPostion = 0;
-    m_lastEventWasMedia = false;
-}

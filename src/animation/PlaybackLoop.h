@@ -47,8 +47,6 @@ public:
     // The frame-accurate step of the export: the event at the position, then one on.
     void stepAnimation();
     void seekToEnd();
-    // Back to the first event without playing, for an export.
-    void rewind();
 
 signals:
     void animationEventChanged();

@@ -33,15 +33,6 @@ BackgroundSelection::Kind BackgroundSelection::kindOf(const QString &identifier)
     return Kind::Invalid;
 }
 
-QString BackgroundSelection::providerName(const QString &identifier)
-{
-    switch (kindOf(identifier)) {
-    case Kind::LiveOsm: return QStringLiteral("???osmand:%1").arg(identifier.mid(osmPrefix.size()));
-    case Kind::LiveEsri: return QStringLiteral("???esri:%1").arg(identifier.mid(esriPrefix.size()));
-    default: return QString();
-    }
-}
-
 QString BackgroundSelection::trackingWord(const QString &identifier)
 {
     static const QStringList known = {QStringLiteral("osm:standard"), QStringLiteral("esri:satellite"),

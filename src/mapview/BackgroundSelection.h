@@ -19,9 +19,6 @@ public:
 
     enum class Kind { Invalid, LiveOsm, LiveEsri, CatalogueMap, Browse, OwnPicture };
     static Kind kindOf(const QString &identifier);
-    // The name that the map plugin is given for a live layer ("???osmand:..." or
-    // "???esri:..."); empty for anything else.
-    static QString providerName(const QString &identifier);
     // The word usage tracking reports for a background.
     static QString trackingWord(const QString &identifier);
 

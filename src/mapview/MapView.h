@@ -212,8 +212,6 @@ public:
     QVariantMap avatarPose() const { return m_avatarPose; }
     QVariantMap animationCamera() const { return m_animationCamera; }
     double animationDurationPerc() const;
-    PlaybackLoop &playback() { return m_playback; }
-    const AnimationEventList &animationEvents() const { return m_eventList; }
     // Set by the exporter while it runs: a click or Control+Space leave the film alone.
     void setExportRunning(bool running) { m_exportRunning = running; }
     bool linearAnimationDuration() const;
